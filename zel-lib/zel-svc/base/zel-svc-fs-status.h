@@ -1,0 +1,8 @@
+#pragma once
+// Sizes and counts of the media folders, kept after an install and compared by a later verification.
+
+inline constexpr const char *ZEL_SVC_FS_STATUS_CONFIG_PATH = "/opt/system/zel-default/output/zel-fs-status-config.ini";
+inline constexpr const char *ZEL_SVC_FS_STATUS_VERIFY_PATH = "/opt/system/zel-default/output/zel-fs-status-verify.ini";
+
+// Mode 1, after an install, deletes both files and writes the first; any other mode writes the second.
+void __zel_svc_config_fs_status_write(int mode);

@@ -1,0 +1,66 @@
+#include "handler/zel-svc-record.h"
+
+#include "base/zel-svc-number.h"
+
+#include <cstdio>
+#include <string>
+
+namespace {
+
+bool wants_line(LineWhen when, std::string_view spec, std::string_view phone) {
+    switch (when) {
+    case LineWhen::Always:
+        return true;
+    case LineWhen::SpecGiven:
+        return !spec.empty();
+    case LineWhen::EitherGiven:
+        return !spec.empty() || !phone.empty();
+    }
+    return true;
+}
+
+// The key of item `number`: the format's one "%d" replaced by it.
+std::string key_of(const char *format, int number) {
+    std::string key{format};
+    if (const std::size_t at = key.find("%d"); at != std::string::npos) key.replace(at, 2, std::to_string(number));
+    return key;
+}
+
+} // namespace
+
+void zel_svc_field_save(ZelSvcDataGroup group, const char *section, const FieldRules &rules, int number,
+                        std::string_view text) {
+    if (!rules.record.key) return;
+    const char *where = rules.record.section ? rules.record.section : section;
+    const std::string key = key_of(rules.record.key, number);
+    switch (rules.record.form) {
+    case FieldForm::TextIfGiven:
+        if (text.empty()) return;
+        [[fallthrough]];
+    case FieldForm::Text:
+        zel_svc_data_set_str(group, where, key.c_str(), text);
+        return;
+    case FieldForm::Word:
+        if (const auto value = zel_svc_accepts_value(rules.accepts, text))
+            zel_svc_data_set_int(group, where, key.c_str(), *value);
+        return;
+    case FieldForm::NumberIfGiven:
+        if (!text.empty()) zel_svc_data_set_int(group, where, key.c_str(), zel_svc_number_from_text(text));
+        return;
+    }
+}
+
+int zel_svc_record_count_up(ZelSvcDataGroup group, const char *section) {
+    const int number = zel_svc_data_get_int(group, section, "count", 0) + 1;
+    zel_svc_data_set_int(group, section, "count", number);
+    return number;
+}
+
+void zel_svc_field_compare(std::string_view item, const FieldReport &report, std::string_view spec,
+                           std::string_view phone) {
+    if (report.label.empty() || !wants_line(report.when, spec, phone)) return;
+    std::string label{item};
+    label.append("/").append(report.label);
+    const bool passes = spec == phone || (report.passes && report.passes(spec, phone));
+    zel_svc_verification_add_compared(label, spec, phone, passes);
+}
