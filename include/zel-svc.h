@@ -103,6 +103,12 @@ typedef struct {
     char sp_name[20];     /* service provider name; empty: any */
 } ZelSvcSimOperator;
 
+/*
+ * Appends a text to the run log, "/opt/system/zel-default/output/zel-config.log", as it is: the caller brings
+ * the newline. Returns 1, or 0 when the log cannot be opened or written.
+ */
+ZEL_SVC_API int zel_svc_config_print_log_file(const char *text);
+
 #ifdef __cplusplus
 }
 #endif

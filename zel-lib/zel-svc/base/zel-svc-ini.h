@@ -54,3 +54,7 @@ class ZelSvcIni {
 // a double one; with both kinds inside, its double quotes become single ones. A line feed becomes a blank.
 // An empty string stays without quotes.
 std::string zel_svc_ini_quoted(std::string_view value);
+
+// A value as the library's integer getter reads it: a leading 0x or 0 makes it hexadecimal or octal, and
+// what is no number is 0.
+int zel_svc_ini_number(const std::string &value);

@@ -1,0 +1,95 @@
+#include "base/zel-svc-ini.h"
+
+#include "base/zel-svc-file.h"
+
+#include <iniparser/iniparser.h>
+
+#include <algorithm>
+#include <cstdio>
+#include <cstdlib>
+#include <fcntl.h>
+
+namespace {
+
+struct CloseStream {
+    void operator()(std::FILE *stream) const { std::fclose(stream); }
+};
+
+} // namespace
+
+void ZelSvcIni::Free::operator()(_dictionary_ *loaded) const { iniparser_freedict(loaded); }
+
+ZelSvcIni ZelSvcIni::load(const char *path) {
+    const ZelSvcFd file = zel_svc_file_open(path, O_RDONLY);
+    return file ? load(file.get()) : ZelSvcIni{};
+}
+
+ZelSvcIni ZelSvcIni::load(int fd) {
+    ZelSvcIni ini;
+    // The library opens files by itself, and only the platform may turn a phone path into one.
+    if (fd >= 0) ini.dictionary_.reset(iniparser_load(("/proc/self/fd/" + std::to_string(fd)).c_str()));
+    return ini;
+}
+
+bool ZelSvcIni::has(const std::string &key) const {
+    return dictionary_ && iniparser_find_entry(dictionary_.get(), key.c_str()) != 0;
+}
+
+const char *ZelSvcIni::text(const std::string &key) const {
+    return dictionary_ ? iniparser_getstring(dictionary_.get(), key.c_str(), nullptr) : nullptr;
+}
+
+// The library's number getters crash on the name of a section: it has no value.
+int ZelSvcIni::number(const std::string &key, int fallback) const {
+    return text(key) ? iniparser_getint(dictionary_.get(), key.c_str(), fallback) : fallback;
+}
+
+int ZelSvcIni::boolean(const std::string &key, int fallback) const {
+    return text(key) ? iniparser_getboolean(dictionary_.get(), key.c_str(), fallback) : fallback;
+}
+
+bool ZelSvcIni::add_section(const std::string &section) {
+    return dictionary_ && iniparser_set(dictionary_.get(), section.c_str(), nullptr) == 0;
+}
+
+bool ZelSvcIni::set(const std::string &key, const std::string &value) {
+    return dictionary_ && iniparser_set(dictionary_.get(), key.c_str(), value.c_str()) == 0;
+}
+
+void ZelSvcIni::unset(const std::string &key) {
+    if (dictionary_) iniparser_unset(dictionary_.get(), key.c_str());
+}
+
+std::vector<std::pair<std::string, const char *>> ZelSvcIni::entries() const {
+    std::vector<std::pair<std::string, const char *>> found;
+    if (!dictionary_) return found;
+    const dictionary &all = *dictionary_;
+    found.reserve(static_cast<std::size_t>(std::max(all.n, 0)));
+    for (ssize_t i = 0; i < all.size; ++i)
+        if (all.key[i]) found.emplace_back(all.key[i], all.val[i]);
+    return found;
+}
+
+bool ZelSvcIni::dump(int fd) const {
+    if (!dictionary_) return false;
+    ZelSvcFd copy{::fcntl(fd, F_DUPFD_CLOEXEC, 0)};
+    std::unique_ptr<std::FILE, CloseStream> stream{copy ? ::fdopen(copy.get(), "w") : nullptr};
+    if (!stream) return false;
+    copy.release(); // the stream closes it
+    iniparser_dump_ini(dictionary_.get(), stream.get());
+    const bool written = std::fflush(stream.get()) == 0 && std::ferror(stream.get()) == 0;
+    return std::fclose(stream.release()) == 0 && written;
+}
+
+std::string zel_svc_ini_quoted(std::string_view value) {
+    if (value.empty()) return {};
+    std::string text{value};
+    std::replace(text.begin(), text.end(), '\n', ' ');
+    const bool has_double = text.find('"') != std::string::npos;
+    const bool has_single = text.find('\'') != std::string::npos;
+    if (has_double && has_single) std::replace(text.begin(), text.end(), '"', '\'');
+    const char quote = has_double && !has_single ? '\'' : '"';
+    return quote + text + quote;
+}
+
+int zel_svc_ini_number(const std::string &value) { return static_cast<int>(std::strtol(value.c_str(), nullptr, 0)); }
