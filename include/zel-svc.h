@@ -104,6 +104,149 @@ typedef struct {
 } ZelSvcSimOperator;
 
 /*
+ * Installs.
+ *
+ * Each writes what it does to the run log. A sales code that is empty, "." or "..", or holds "/" names no
+ * folder: each of its files counts as missing, and the run goes on with what does not depend on them.
+ */
+
+/*
+ * Applies one customer's specification to the phone. `customer` names the folder as it is (no internal name
+ * is looked up) and is cut to 9 bytes. `kind` is a ZelSvcInstallKind; any other number writes the start and
+ * end lines of configuration mode and its time, and installs nothing.
+ *
+ * On a phone with more than one SIM slot the groups that depend on the SIM are installed once more, into the
+ * second SIM's network database ("/opt/dbspace/.dnet2.db") and its "-2" section files. That pass does not
+ * resolve the networks again: fast dormancy and the maximum number of PDP contexts get the network ids of
+ * the first SIM's database.
+ */
+ZEL_SVC_API void zel_svc_config_install_customer(const char *customer, int kind);
+
+/* Applies the package's header: its names and versions go to the settings store ("db/private/zel/bin_name",
+ * "db/private/zel/bin_version", "db/zel/bincode", "db/zel/bin_full_version"). */
+ZEL_SVC_API void zel_svc_config_install_header(void);
+
+/* First start: stores the active customer, installs the header and the customer's full configuration, and
+ * sets "db/private/telephony/zel_config" to 1. The display is kept on meanwhile. */
+ZEL_SVC_API void zel_svc_config_set_pre_config_for_config_mode(const char *customer);
+
+/* After a firmware update, before normal start: stores the active customer, installs the header, and upgrades
+ * presets, user files and file system. The customer's file is not read. */
+ZEL_SVC_API void zel_svc_config_upgrade_pre_config_for_fota_mode(const char *customer);
+
+/* First normal start after a firmware update: reads the active customer's file again, for the networks, the
+ * groups whose Auto flag is 0 and IMS. Without an active customer it does nothing. The display is kept on
+ * meanwhile. */
+ZEL_SVC_API void zel_svc_config_upgrade_pre_config_for_normal_booting(void);
+
+/* Stores the active customer and nothing else; 1. For factory tools that write the IMEI. */
+ZEL_SVC_API int zel_svc_config_set_pre_config_for_imei(const char *customer);
+
+/* Before a factory reset: starts a new run log, sets "db/menu_widget/language" to the language that the
+ * customer's specification named, and deletes "/opt/system/zel-default/SW_Configuration.xml"; 1. */
+ZEL_SVC_API int zel_svc_config_set_pre_config_for_factory_reset(void);
+
+/* Flushes file systems and restarts the phone. */
+ZEL_SVC_API void zel_svc_config_reboot(void);
+
+/*
+ * The active customer: the sales code that the phone is configured for. "db/zel/salescode" is the working
+ * copy; "/csa/zel/zel-active-customer.inf" survives a factory reset.
+ */
+
+/*
+ * Stores a code in the settings store, in /csa and in the last three bytes of the phone's product code
+ * ("/csa/imei/prodcode.dat"), and sets "db/zel/operator", "db/zel/operator_country", "db/zel/operator_region"
+ * and "db/zel/operator_sim" to the code's numbers, 0 for an unknown code. Every step is tried, whatever the
+ * one before it did; failures are in the run log. A code of fewer than three bytes leaves the product code
+ * as it is; of a longer one it takes the first three.
+ */
+ZEL_SVC_API void zel_svc_config_set_active_customer_name(const char *customer);
+
+/* Copies the active customer's code; `buffer` may be null and `size` 0 or less to ask only whether there is
+ * one. 0, and an empty buffer, when there is none: the key cannot be read, is empty, or is "DEF". */
+ZEL_SVC_API int zel_svc_config_get_active_customer_name(char *buffer, int size);
+
+/* 1 when there is an active customer, else 0. */
+ZEL_SVC_API int zel_svc_config_chk_active_customer_exist(void);
+
+/* The three bytes that /csa keeps of the active customer's code. 0, and an empty buffer, when there are not as
+ * many; 0 too with a null buffer or a size of 0 or less. */
+ZEL_SVC_API int zel_svc_config_get_active_customer_name_from_csa(char *buffer, int size);
+
+/*
+ * Queries of the package, "/opt/system/zel/mps/ZEL/SW_Configuration.xml" and the customers' files. They parse
+ * the file anew and set the process's parse mode, so they do not belong into the middle of an install.
+ */
+
+/* The folder that a sales code uses: "TFG" and 1 for the codes that share it, else the code itself and 0. */
+ZEL_SVC_API int zel_svc_config_get_internal_customer_name(const char *customer, char *buffer, int size);
+
+/*
+ * Fills `list`, which must hold ZEL_SVC_MAX_CUSTOMERS entries, and `count`, 0 to ZEL_SVC_MAX_CUSTOMERS. The
+ * count is the one that the package states: an entry that the package does not describe has an empty name.
+ * 1 also without a package (count 0).
+ */
+ZEL_SVC_API int zel_svc_config_get_customer_list(ZelSvcCustomer *list, int32_t *count);
+
+/* 1 when the package lists the folder of a sales code. An empty name never exists. */
+ZEL_SVC_API int zel_svc_config_chk_customer_name_exist_in_zel_bin(const char *customer);
+
+/* The name of the package's first customer. 0, and an empty buffer, when there is none. */
+ZEL_SVC_API int zel_svc_config_get_first_customer_name_in_zel_bin(char *buffer, int size);
+
+/*
+ * The package's name directly followed by its version, at most 9 bytes of each. 0 and "Q0000NXBBBB1" when the
+ * phone knows either not; a size below 1 gives 0.
+ * Writes: what the header states goes to "db/private/zel/bin_name", "db/private/zel/bin_version" and
+ * "db/zel/bincode"; what it does not state is answered from those keys.
+ */
+ZEL_SVC_API int zel_svc_config_get_zel_bin_version(char *buffer, int size);
+
+/*
+ * The approval versions of "/opt/system/zel-default/usr/zel/zel-approval-ver.ini", at most 19 bytes each. The
+ * customer package's version is answered only where the file states the communication processor's. 1 when
+ * any version is filled; else 0 and an empty record.
+ */
+ZEL_SVC_API int zel_svc_config_get_approval_version(ZelSvcApprovalVersion *result);
+
+/* 1 when that file states any of the three versions, an empty one included. */
+ZEL_SVC_API int zel_svc_config_chk_approval_version_exist(void);
+
+/*
+ * The SIM locks of the active customer's file; 0 without an active customer, the record is then left as it is.
+ * A file without locks, and a missing one, give an empty record and 1.
+ * Writes: starts the security group's file, "/opt/system/zel-default/data/zel-default-data-security.ini",
+ * afresh and records the locks there.
+ */
+ZEL_SVC_API int zel_svc_config_get_security_lock_info(ZelSvcSecurityLock *result);
+
+/*
+ * SIM auto setting: the operator that the inserted SIM card decided on, kept for each SIM slot in string keys
+ * below "db/private/zel". Slot 2 is the second SIM's; any other number is the first's. The customer's name
+ * is one for both slots.
+ */
+
+/*
+ * Stores the operator of a slot; 1 when every key could be written. An empty customer name leaves the stored
+ * one as it is. It writes the operator's keys and no others: where the user chose the operator, the caller
+ * installs it, sets it active, stores the SIM's identity ("db/private/zel/sim_mcc_mnc",
+ * "db/private/zel/sim_msin", "db/private/zel/sim2/...") and clears "db/private/zel/sim_selection_show" itself.
+ */
+ZEL_SVC_API int zel_svc_sim_auto_setting_set_active_operator(const ZelSvcSimOperator *operator_entry, int slot);
+
+/*
+ * Forgets the operators and the SIM identities of both slots, so that every inserted SIM counts as new, and
+ * resets the selection and SIM-changed flags ("memory/private/zel/sim_changed" is reset nowhere else). The
+ * customer's name stays. 1 when every key could be written.
+ */
+ZEL_SVC_API int zel_svc_sim_auto_setting_clear_active_operator(void);
+
+/* Reads the operator of a slot; the record may be null. 1 when all six keys are there; what is there is
+ * filled in any case. The service provider's name is cut to 14 bytes. */
+ZEL_SVC_API int zel_svc_sim_auto_setting_get_active_operator(ZelSvcSimOperator *operator_entry, int slot);
+
+/*
  * Appends a text to the run log, "/opt/system/zel-default/output/zel-config.log", as it is: the caller brings
  * the newline. Returns 1, or 0 when the log cannot be opened or written.
  */
