@@ -14,6 +14,9 @@ std::size_t zel_svc_text_cut(std::string_view text, std::size_t limit);
 // first NUL byte. A size of 0 touches nothing.
 void zel_svc_text_copy(char *target, std::size_t size, std::string_view text);
 
+// The bytes of a buffer whose size a caller of the interface gives; a size below 0 is none.
+constexpr std::size_t zel_svc_buffer_size(int size) { return size > 0 ? static_cast<std::size_t>(size) : 0; }
+
 // The text that a fixed-width field holds: up to its terminator or its width.
 inline std::string_view zel_svc_text_view(const char *field, std::size_t width) {
     return {field, strnlen(field, width)};
