@@ -2,7 +2,6 @@
 
 #include "base/zel-svc-number.h"
 
-#include <cstdio>
 #include <string>
 
 namespace {
@@ -26,28 +25,34 @@ std::string key_of(const char *format, int number) {
     return key;
 }
 
+bool is_text(FieldForm form) { return form == FieldForm::Text || form == FieldForm::TextIfGiven; }
+
+std::optional<std::int32_t> number_of(const FieldRules &rules, std::string_view text) {
+    if (rules.record.form == FieldForm::Word) {
+        const auto value = zel_svc_accepts_value(rules.accepts, text);
+        return value ? value : rules.record.otherwise;
+    }
+    if (text.empty()) return std::nullopt;
+    return rules.record.reads ? rules.record.reads(text) : zel_svc_number_from_text(text);
+}
+
 } // namespace
 
-void zel_svc_field_save(ZelSvcDataGroup group, const char *section, const FieldRules &rules, int number,
+bool zel_svc_field_save(ZelSvcDataGroup group, const char *section, const FieldRules &rules, int number,
                         std::string_view text) {
-    if (!rules.record.key) return;
-    const char *where = rules.record.section ? rules.record.section : section;
-    const std::string key = key_of(rules.record.key, number);
-    switch (rules.record.form) {
-    case FieldForm::TextIfGiven:
-        if (text.empty()) return;
-        [[fallthrough]];
-    case FieldForm::Text:
+    const FieldRecord &record = rules.record;
+    if (!record.key) return false;
+    const char *where = record.section ? record.section : section;
+    const std::string key = key_of(record.key, number);
+    if (is_text(record.form)) {
+        if (record.form == FieldForm::TextIfGiven && text.empty()) return false;
         zel_svc_data_set_str(group, where, key.c_str(), text);
-        return;
-    case FieldForm::Word:
-        if (const auto value = zel_svc_accepts_value(rules.accepts, text))
-            zel_svc_data_set_int(group, where, key.c_str(), *value);
-        return;
-    case FieldForm::NumberIfGiven:
-        if (!text.empty()) zel_svc_data_set_int(group, where, key.c_str(), zel_svc_number_from_text(text));
-        return;
+        return true;
     }
+    const std::optional<std::int32_t> value = number_of(rules, text);
+    if (!value) return false;
+    zel_svc_data_set_int(group, where, key.c_str(), *value);
+    return true;
 }
 
 int zel_svc_record_count_up(ZelSvcDataGroup group, const char *section) {

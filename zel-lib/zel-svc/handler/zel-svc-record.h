@@ -23,26 +23,35 @@
 #include "base/zel-svc-observer.h"
 #include "base/zel-svc-text.h"
 
+#include <cstdint>
 #include <memory>
 #include <new>
+#include <optional>
 #include <span>
 #include <string_view>
+#include <utility>
 
 // Actions in which a field takes its text from the spec. In the export every field gives its text out.
 enum class FieldFills { Install, InstallAndVerify };
 
-// How the section store keeps a field: under `key`, a format with one "%d" for the item's number.
+// What becomes of a text that a field does not accept: it is ignored, or it is kept as it is and only its
+// later use falls back ("Editable" of a bookmark: whatever is not "no" means yes).
+enum class FieldOthers { Ignored, Kept };
+
+// How the section store keeps a field: under `key`, a format with at most one "%d" for the item's number.
 enum class FieldForm {
     Text,         // the text, an empty one included
     TextIfGiven,  // nothing for an empty text
-    Word,         // the number that the accepted word stands for; nothing for any other text
-    NumberIfGiven // the decimal number; nothing for an empty text
+    Word,         // the number that the accepted word stands for; for any other text `otherwise`
+    NumberIfGiven // the number that `reads` finds in the text; nothing for an empty text
 };
 
 struct FieldRecord {
     const char *key = nullptr;
     FieldForm form = FieldForm::Text;
-    const char *section = nullptr; // where it is not the record's own
+    const char *section = nullptr;                     // where it is not the record's own
+    std::optional<std::int32_t> otherwise = {};        // Word; without it other texts are not recorded
+    std::int32_t (*reads)(std::string_view) = nullptr; // NumberIfGiven; null: a decimal number
 };
 
 // When a field's result line is written and when it passes.
@@ -57,6 +66,7 @@ struct FieldReport {
 
 struct FieldRules {
     Accepts accepts = any_text();
+    FieldOthers others = FieldOthers::Ignored;
     FieldFills fills = FieldFills::InstallAndVerify;
     FieldRecord record = {};
     FieldReport report = {};
@@ -120,6 +130,13 @@ template <class R> class OpenRecord {
     R *operator->() { return record_.get(); }
     R &operator*() { return *record_; }
 
+    // The bytes of the element's field in the open record; nothing without either.
+    std::optional<FieldText> text_of(std::span<const Field<R>> fields, ZelSvcElementId element) {
+        const Field<R> *field = record_ ? zel_svc_field_find(fields, element) : nullptr;
+        if (!field) return std::nullopt;
+        return field->of(*record_);
+    }
+
     // Copies a value's text into the field of its element, or out of it in an export. False when there is
     // no record, no such field, or the text is not accepted.
     bool copy(std::span<const Field<R>> fields, Occurrence &occurrence) {
@@ -127,11 +144,12 @@ template <class R> class OpenRecord {
         if (!field) return false;
         const FieldText text = field->of(*record_);
         if (occurrence.exports()) {
-            occurrence.out->assign(text.view());
-            return true;
+            if (occurrence.out) occurrence.out->assign(text.view());
+            return occurrence.out != nullptr;
         }
         if (occurrence.verifies() && field->rules.fills == FieldFills::Install) return false;
-        if (!zel_svc_accepts_value(field->rules.accepts, occurrence.text)) {
+        if (field->rules.others == FieldOthers::Ignored &&
+            !zel_svc_accepts_value(field->rules.accepts, occurrence.text)) {
             zel_svc_observer().refused_text(occurrence.tag, occurrence.text, occurrence.offset);
             return false;
         }
@@ -143,8 +161,9 @@ template <class R> class OpenRecord {
     std::unique_ptr<R> record_;
 };
 
-// Writes one field of item number `number` to the section store in the form that its rules name.
-void zel_svc_field_save(ZelSvcDataGroup group, const char *section, const FieldRules &rules, int number,
+// Writes one field of item number `number` to the section store in the form that its rules name. False when
+// there was nothing to write.
+bool zel_svc_field_save(ZelSvcDataGroup group, const char *section, const FieldRules &rules, int number,
                         std::string_view text);
 
 // Writes every field that has a record key, in table order.

@@ -8,6 +8,7 @@
 
 #include <algorithm>
 #include <cstdlib>
+#include <iterator>
 #include <memory>
 
 namespace {
@@ -18,40 +19,17 @@ struct FreeString {
     void operator()(char *text) const { std::free(text); }
 };
 
-bool write_store(const Store &store, std::int32_t value, std::string_view text) {
-    switch (store.type) {
-    case KeyType::Int:
-        return vconf_set_int(store.key, value) == 0;
-    case KeyType::Bool:
-        return vconf_set_bool(store.key, value) == 0;
-    case KeyType::String:
-        return vconf_set_str(store.key, std::string{text}.c_str()) == 0;
-    }
-    return false;
-}
-
-std::optional<std::int32_t> read_number(const Store &store) {
-    int value = 0;
-    const int result =
-        store.type == KeyType::Bool ? vconf_get_bool(store.key, &value) : vconf_get_int(store.key, &value);
-    if (result != 0) return std::nullopt;
-    return value;
-}
-
 void write_records(const Setting &setting, std::size_t stores_written, std::int32_t value, std::string_view text) {
-    const auto used = static_cast<std::size_t>(std::count_if(setting.stores.begin(), setting.stores.end(),
+    const auto used = static_cast<std::size_t>(std::count_if(std::begin(setting.stores), std::end(setting.stores),
                                                              [](const Store &store) { return store.key != nullptr; }));
     for (const Record &record : setting.records) {
-        if (!record.key || stores_written < std::min(record.after, used)) continue;
-        if (record.form == RecordForm::SpecText)
-            zel_svc_data_set_str(record.group, record.section, record.key, text);
-        else
-            zel_svc_data_set_int(record.group, record.section, record.key, value);
+        if (stores_written < std::min(record.after, used)) continue;
+        zel_svc_setting_record(record, value, text);
     }
 }
 
 void verify_volume(const Setting &setting, std::string_view tag, std::string_view text) {
-    const auto stored = read_number(setting.stores[0]);
+    const auto stored = zel_svc_store_number(setting.stores[0]);
     if (!stored) return;
     const auto levels = static_cast<std::uint32_t>(*stored);
     const std::string speaker = std::to_string(levels & 0xFFU);
@@ -61,7 +39,7 @@ void verify_volume(const Setting &setting, std::string_view tag, std::string_vie
 }
 
 void verify_number(const Setting &setting, std::string_view tag, std::string_view text) {
-    const auto stored = read_number(setting.stores[0]);
+    const auto stored = zel_svc_store_number(setting.stores[0]);
     const std::int32_t spec = zel_svc_number_from_text(text);
     const std::string shown = stored ? zel_svc_number_text(*stored) : std::string{setting.report.shown_as};
     zel_svc_setting_add_result(setting.report.label, tag, zel_svc_number_text(spec), shown, stored == spec);
@@ -78,8 +56,13 @@ bool flag_is_off(ZelSvcAutoFlag flag) {
     return flag == ZEL_SVC_AUTO_NEVER || gbZelSvcNetworkAutoFlags.at(static_cast<std::size_t>(flag)) != 1;
 }
 
+bool says_something(const Setting &setting) {
+    if (setting.exports.when == Export::When::Recorded) return zel_svc_setting_is_recorded(setting);
+    return setting.exports.when != Export::When::Never;
+}
+
 void encode(const Setting &setting, Occurrence &occurrence) {
-    if (!occurrence.out) return;
+    if (!occurrence.out || !says_something(setting)) return;
     if (setting.encode) return setting.encode(setting, occurrence);
     zel_svc_setting_encode(setting, *occurrence.out);
 }
@@ -122,7 +105,7 @@ bool zel_svc_setting_install(const Setting &setting, std::string_view text) {
     bool refused = false;
     for (const Store &store : setting.stores) {
         if (!store.key) continue;
-        refused = !write_store(store, *value, text);
+        refused = !zel_svc_store_write(store, *value, text);
         if (refused) break;
         ++written;
     }
@@ -144,23 +127,54 @@ void zel_svc_setting_verify(const Setting &setting, std::string_view tag, std::s
 }
 
 void zel_svc_setting_encode(const Setting &setting, ZelSvcExportText &out) {
-    if (setting.exports.when == Export::When::Never) return;
-    if (setting.exports.when == Export::When::Recorded && !zel_svc_setting_is_recorded(setting)) return;
+    if (!says_something(setting)) return;
     const auto phone = zel_svc_setting_phone_text(setting);
     out.assign(phone ? std::string_view{*phone} : setting.exports.shown_as);
 }
 
 std::optional<std::string> zel_svc_setting_phone_text(const Setting &setting) {
     const Store &store = setting.stores[0];
-    if (!store.key) return std::nullopt;
-    if (store.type == KeyType::String) {
-        const std::unique_ptr<char, FreeString> text{vconf_get_str(store.key)};
-        if (!text) return std::nullopt;
-        return std::string{text.get()};
-    }
-    const auto value = read_number(store);
+    if (store.type == KeyType::String) return zel_svc_store_text(store);
+    const auto value = zel_svc_store_number(store);
     if (!value) return std::nullopt;
     return zel_svc_accepts_text(setting.accepts, *value).value_or(std::string{kUnknown});
+}
+
+bool zel_svc_store_write(const Store &store, std::int32_t value, std::string_view text) {
+    if (!store.key) return false;
+    switch (store.type) {
+    case KeyType::Int:
+        return vconf_set_int(store.key, value) == 0;
+    case KeyType::Bool:
+        return vconf_set_bool(store.key, value) == 0;
+    case KeyType::String:
+        return vconf_set_str(store.key, std::string{text}.c_str()) == 0;
+    }
+    return false;
+}
+
+std::optional<std::int32_t> zel_svc_store_number(const Store &store) {
+    if (!store.key || store.type == KeyType::String) return std::nullopt;
+    int value = 0;
+    const int result =
+        store.type == KeyType::Bool ? vconf_get_bool(store.key, &value) : vconf_get_int(store.key, &value);
+    if (result != 0) return std::nullopt;
+    return value;
+}
+
+std::optional<std::string> zel_svc_store_text(const Store &store) {
+    if (!store.key || store.type != KeyType::String) return std::nullopt;
+    const std::unique_ptr<char, FreeString> text{vconf_get_str(store.key)};
+    if (!text) return std::nullopt;
+    return std::string{text.get()};
+}
+
+void zel_svc_setting_record(const Record &record, std::int32_t value, std::string_view text) {
+    if (!record.key) return;
+    if (record.form == RecordForm::SpecText)
+        zel_svc_data_set_str(record.group, record.section, record.key, text);
+    else
+        zel_svc_data_set_int(record.group, record.section, record.key, value);
 }
 
 bool zel_svc_setting_is_recorded(const Setting &setting) {

@@ -18,14 +18,15 @@
 // Verify: an accepted text is compared with the first store, and one line is added.
 // Export: the first store's value as a spec text.
 //
-// A setting with one odd step names a function for exactly that step.
+// A setting with one odd step names a function for exactly that step; its other columns stay true, so that
+// whoever reads the row (a checker, the manual, completion) need not know the function.
 
 #include "handler/zel-svc-accepts.h"
 #include "spec/zel-svc-data.h"
 #include "spec/zel-svc-occurrence.h"
 
-#include <array>
 #include <cstdint>
+#include <optional>
 #include <span>
 #include <string>
 #include <string_view>
@@ -75,9 +76,10 @@ constexpr Report number_in(std::string_view label, std::string_view unreadable) 
 }
 constexpr Report volume_if_readable() { return {.as = Report::As::Volume, .unreadable = Report::Unreadable::NoLine}; }
 
-// When the export says something, and what stands for a value that cannot be read.
+// When the export says something, and what stands for a value that cannot be read. An odd encode step runs
+// only when this says so: `when` tells whether, the step tells what.
 struct Export {
-    enum class When { Never, Recorded, Readable };
+    enum class When { Never, Recorded, Readable, Always };
 
     When when = When::Never;
     std::string_view shown_as = "??";
@@ -86,6 +88,7 @@ struct Export {
 constexpr Export never() { return {}; }
 constexpr Export if_recorded(std::string_view unreadable = "??") { return {Export::When::Recorded, unreadable}; }
 constexpr Export if_readable() { return {Export::When::Readable, ""}; }
+constexpr Export always(std::string_view unreadable = "??") { return {Export::When::Always, unreadable}; }
 
 struct Setting;
 using SettingStep = void (*)(const Setting &, Occurrence &);
@@ -93,8 +96,8 @@ using SettingStep = void (*)(const Setting &, Occurrence &);
 struct Setting {
     ZelSvcElementId element;
     Accepts accepts = any_text();
-    std::array<Store, 2> stores = {};
-    std::array<Record, 2> records = {};
+    Store stores[3]; // unused places are empty
+    Record records[3];
     Report report = no_report();
     Export exports = never();
     ZelSvcAutoFlag auto_flag = ZEL_SVC_AUTO_NEVER; // verified only while this flag is not 1
@@ -118,7 +121,14 @@ void zel_svc_setting_encode(const Setting &setting, ZelSvcExportText &out);
 // The phone's value of the first store as a spec text; nothing when it cannot be read. A value outside the
 // accepted ones gives "??".
 std::optional<std::string> zel_svc_setting_phone_text(const Setting &setting);
-bool zel_svc_setting_is_recorded(const Setting &setting);
+bool zel_svc_setting_is_recorded(const Setting &setting); // its first record exists
+
+// One place of a row, for odd steps that keep their keys in the columns. Writing a store uses the number or
+// the text, as its type wants; a read gives nothing for a key of another type.
+bool zel_svc_store_write(const Store &store, std::int32_t value, std::string_view text);
+std::optional<std::int32_t> zel_svc_store_number(const Store &store);
+std::optional<std::string> zel_svc_store_text(const Store &store);
+void zel_svc_setting_record(const Record &record, std::int32_t value, std::string_view text);
 
 // Adds one line "[label/tag] Spec='...',Phone='...'"; an empty label leaves "[tag]".
 void zel_svc_setting_add_result(std::string_view label, std::string_view tag, std::string_view spec,
