@@ -1,0 +1,1 @@
+"""What the scripts share: the element table, the providers' data, spec files, media, the guide's tables."""
