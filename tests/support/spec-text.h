@@ -2,15 +2,11 @@
 // Runs pieces of spec text and single elements of the export against the phone under test, the way the
 // library's entry points do. For unit tests: it needs the library's objects.
 //
-//     class Gps : public zel_test::BenchPhone {
-//       protected:
-//         zel_test::LoadedGroup group_{ZEL_SVC_DATA_GPS};
-//     };
-//
 //     TEST_F(Gps, OnStoresOne) {
+//         const zel_test::LoadedGroup group{ZEL_SVC_DATA_GPS};
 //         zel_test::install_spec("<GPS><GPSActivation>on</GPSActivation></GPS>");
 //         EXPECT_EQ(get_int("db/..."), 1);
-//         EXPECT_EQ(group_.number("gps", "gps_activation"), 1);
+//         EXPECT_EQ(group.number("gps", "gps_activation"), 1);
 //     }
 //     TEST_F(Gps, AnotherValueFails) {
 //         set_int("db/...", 0);
@@ -121,7 +117,8 @@ inline std::string export_value(ZelSvcElementId id) {
     return text;
 }
 
-// A group of the section store, loaded afresh and empty; writes to a group that is not loaded are lost.
+// A group of the section store, loaded afresh and empty; writes to a group that is not loaded are lost. Make
+// it in the test or in SetUp(), behind BenchPhone's: a member of the fixture comes before the phone.
 class LoadedGroup {
   public:
     explicit LoadedGroup(ZelSvcDataGroup group) : group_(group) { zel_svc_data_load(group, ZEL_SVC_DATA_SIM1, 1); }

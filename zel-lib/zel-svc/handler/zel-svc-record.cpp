@@ -65,7 +65,8 @@ void zel_svc_field_compare(std::string_view item, const FieldReport &report, std
                            std::string_view phone) {
     if (report.label.empty() || !wants_line(report.when, spec, phone)) return;
     std::string label{item};
-    label.append("/").append(report.label);
+    if (!item.empty()) label += '/';
+    label += report.label;
     const bool passes = spec == phone || (report.passes && report.passes(spec, phone));
     zel_svc_verification_add_compared(label, spec, phone, passes);
 }

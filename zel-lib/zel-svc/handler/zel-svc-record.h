@@ -177,7 +177,8 @@ void zel_svc_record_save(ZelSvcDataGroup group, const char *section, std::span<c
 // Raises the section's "count" by one and returns it: the number of the item to be written.
 int zel_svc_record_count_up(ZelSvcDataGroup group, const char *section);
 
-// Adds the line "[item/label] Spec='...',Phone='...'" of one field, when its rules want one.
+// Adds the line "[item/label] Spec='...',Phone='...'" of one field, when its rules want one; an empty item
+// leaves "[label]".
 void zel_svc_field_compare(std::string_view item, const FieldReport &report, std::string_view spec,
                            std::string_view phone);
 
