@@ -1,5 +1,6 @@
 #include "spec/zel-svc-element-table.h"
 
+#include "zel-svc-element-act-general-info.h"
 #include "zel-svc-element-act-header.h"
 #include "zel-svc-element-act-main.h"
 #include "zel-svc-element-act-network-info.h"
@@ -33,9 +34,9 @@ extern constexpr std::array<ZelSvcElement, ZEL_SVC_ELEMENT_COUNT> kZelSvcElement
     {ZEL_SVC_ELEMENT_CUSTOMER_DATA_SET_CUSTOMER_DATA, "CustomerData",                    "CustomerDataSet",   zel_svc_element_act_header_customer_start, kNone, kNone, kRepeats, 1},
     {ZEL_SVC_ELEMENT_CUSTOMER_DATA,                   "CustomerData",                    "",                  kNone, kNone, kNone, kOnce, 1},
     // general information
-    {ZEL_SVC_ELEMENT_GENERAL_INFO,                    "GeneralInfo",                     "",                  kNone, kNone, kNone, kOnce, 1},
-    {ZEL_SVC_ELEMENT_SALES_CODE,                      "SalesCode",                       "",                  kNone, kNone, kNone, kOnce, 1},
-    {ZEL_SVC_ELEMENT_COUNTRY_ISO,                     "CountryISO",                      "",                  kNone, kNone, kNone, kOnce, 1},
+    {ZEL_SVC_ELEMENT_GENERAL_INFO,                    "GeneralInfo",                     "",                  zel_svc_element_act_general_info_start, kNone, kNone, kOnce, 1},
+    {ZEL_SVC_ELEMENT_SALES_CODE,                      "SalesCode",                       "",                  kNone, zel_svc_element_act_general_info_value, kNone, kOnce, 1},
+    {ZEL_SVC_ELEMENT_COUNTRY_ISO,                     "CountryISO",                      "",                  kNone, zel_svc_element_act_general_info_value, kNone, kOnce, 1},
     // network identities
     {ZEL_SVC_ELEMENT_NETWORK_INFO,                    "NetworkInfo",                     "",                  zel_svc_element_act_network_info_start, kNone, zel_svc_element_act_network_info_end, kRepeats, 1},
     {ZEL_SVC_ELEMENT_MCCMNC,                          "MCCMNC",                          "",                  kNone, zel_svc_element_act_network_info_value, kNone, kRepeats, 1},
