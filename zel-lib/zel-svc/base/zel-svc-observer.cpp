@@ -14,3 +14,5 @@ ZelSvcObserver *zel_svc_set_observer(ZelSvcObserver *observer) {
 }
 
 ZelSvcObserver &zel_svc_observer() { return gpObserver ? *gpObserver : gNobody; }
+
+bool zel_svc_is_observed() { return gpObserver != nullptr; }

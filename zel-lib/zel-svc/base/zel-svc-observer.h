@@ -37,3 +37,6 @@ ZelSvcObserver *zel_svc_set_observer(ZelSvcObserver *observer);
 
 // The listener; never null: one that ignores everything stands in for none.
 ZelSvcObserver &zel_svc_observer();
+
+// Whether one is set: for news that costs work to put together.
+bool zel_svc_is_observed();

@@ -17,6 +17,10 @@ enum ZelSvcDispatchResult : std::int32_t {
 // Forgets open elements and occurrence counts; the enabled rows and the stop element stay.
 void zel_svc_element_table_init();
 
+// Which tokenizer the events come from, and the file offset of its first byte: handlers and observers learn
+// from them where an item stands. Null for none.
+void zel_svc_element_set_source(const ZelSvcXmlParser *parser, std::int32_t first_offset);
+
 // The row of a tag at this place: the first one of that tag whose parent is the enclosing element, or that
 // takes any parent. ZEL_SVC_ELEMENT_NONE when there is none.
 ZelSvcElementId zel_svc_element_find(const char *tag);

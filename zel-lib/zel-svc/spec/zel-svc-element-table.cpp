@@ -351,6 +351,10 @@ extern constexpr std::array<ZelSvcElement, ZEL_SVC_ELEMENT_COUNT> kZelSvcElement
 }};
 // clang-format on
 
+extern constexpr ZelSvcParseBegin kZelSvcParseBegins[] = {
+    nullptr,
+};
+
 namespace {
 
 constexpr bool ids_count_the_rows() {

@@ -19,3 +19,8 @@ struct ZelSvcElement {
 };
 
 extern const std::array<ZelSvcElement, ZEL_SVC_ELEMENT_COUNT> kZelSvcElementTable;
+
+// Called in this order when a parse begins, for what an earlier parse left open because its file ended too
+// early. A null pointer ends the list.
+using ZelSvcParseBegin = void (*)();
+extern const ZelSvcParseBegin kZelSvcParseBegins[];

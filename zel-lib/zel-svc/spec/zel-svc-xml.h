@@ -19,7 +19,8 @@ struct ZelSvcXmlCursor {
     std::int32_t position; // of the next byte to read
 };
 
-// Only the result of end_element is looked at: ZEL_SVC_XML_STOP ends the parse.
+// Only the result of end_element is looked at: ZEL_SVC_XML_STOP ends the parse. Items without a callback (a
+// null slot) are read and dropped.
 struct ZelSvcXmlCallbacks {
     std::int32_t (*start_document)(std::uint32_t user, const char *buffer, std::int32_t length);
     std::int32_t (*end_document)(std::uint32_t user);
@@ -38,12 +39,15 @@ struct ZelSvcXmlParser {
     ZelSvcXmlCursor *cursor; // owned
     const ZelSvcXmlCallbacks *callbacks;
     std::uint32_t user;
+    std::int32_t item; // during a callback: index of the first byte of its item
 };
 
 ZelSvcXmlParser *zel_svc_xml_parser_create(const ZelSvcXmlCallbacks *callbacks, std::uint32_t user);
 void zel_svc_xml_parser_destroy(ZelSvcXmlParser *parser);
+// Afterwards the cursor's position is where reading ended.
 ZelSvcXmlResult zel_svc_xml_parse(ZelSvcXmlParser *parser, const char *buffer, std::int32_t length);
 
-// New strings that the caller releases with free(3); null on failure.
+// New strings that the caller releases with free(3); null on failure, and for texts or results of more than
+// 65,535 bytes. An empty `from` or `to` is a failure too.
 char *zel_svc_xml_decode_entities(const char *text);
 char *zel_svc_str_replace_all(const char *text, const char *from, const char *to);
