@@ -1,0 +1,61 @@
+#pragma once
+// The platform functions of the bench phone, a row each: what a call is called in the journal and in a
+// fault, what its failing means, and which argument is the text that a fault may name.
+
+#include <cstddef>
+#include <iterator>
+#include <string_view>
+
+namespace zel_host {
+
+enum class Failing {
+    Result,      // the function returns the fault's number; what it would have filled stays untouched
+    NullPointer, // the function returns a null pointer
+    Nothing,     // the function has no result: it just does not do its work
+};
+
+struct Function {
+    std::string_view name;
+    Failing failing = Failing::Result;
+    int result = -1; // what it returns when it fails, unless a fault says otherwise
+    int text = -1;   // number of the argument that is its text, from 0; -1: it has none
+};
+
+inline constexpr Function kFunctions[] = {
+    {.name = "vconf_get_int", .text = 0},
+    {.name = "vconf_get_bool", .text = 0},
+    {.name = "vconf_get_str", .failing = Failing::NullPointer, .text = 0},
+    {.name = "vconf_set_int", .text = 0},
+    {.name = "vconf_set_bool", .text = 0},
+    {.name = "vconf_set_str", .text = 0},
+    {.name = "__dlog_print", .text = 2},
+    {.name = "db_util_open", .result = 14, .text = 0}, // SQLITE_CANTOPEN
+    {.name = "db_util_close", .result = 5},            // SQLITE_BUSY
+    {.name = "security_server_label_access", .text = 0},
+    {.name = "smack_lgetlabel", .text = 0},
+    {.name = "device_power_request_lock"},
+    {.name = "device_power_release_lock"},
+    {.name = "elm_init", .result = 0},
+    {.name = "elm_shutdown", .result = 0},
+    {.name = "uxt_theme_set_suitable_system_color_info_from_image", .text = 0},
+    {.name = "zel_platform_open", .text = 0},
+    {.name = "zel_platform_open_parent", .text = 0},
+    {.name = "zel_platform_set_owner"},
+    {.name = "zel_platform_get_owner"},
+    {.name = "zel_platform_command", .text = 0},
+    {.name = "zel_platform_sync", .failing = Failing::Nothing},
+    {.name = "zel_platform_reboot"},
+    {.name = "zel_platform_now"},
+};
+
+// The number of a function's row; a name without a row does not compile.
+consteval std::size_t function(std::string_view name) {
+    for (std::size_t row = 0; row < std::size(kFunctions); ++row)
+        if (kFunctions[row].name == name) return row;
+    throw "no platform function has this name";
+}
+
+// The same for a name from outside; null without a row.
+const Function *find_function(std::string_view name);
+
+} // namespace zel_host
