@@ -3,6 +3,6 @@ find_package(Python3 3.9 COMPONENTS Interpreter REQUIRED)
 
 add_test(NAME package.ExampleIsReadableAndUsesEveryElement
          COMMAND Python3::Interpreter ${PROJECT_SOURCE_DIR}/scripts/check-example)
-foreach(topic checker remake generators)
+foreach(topic checker guide generators remake)
   add_test(NAME package.${topic} COMMAND Python3::Interpreter -B ${CMAKE_CURRENT_LIST_DIR}/test_${topic}.py)
 endforeach()

@@ -80,6 +80,14 @@ class Checker(unittest.TestCase):
         self.replace("<Bearer>cs<", "<Bearer>cs <")
         self.assert_found("blanks around 'cs '")
 
+    def test_a_text_that_is_ignored(self):
+        self.replace("<TimeFormat>24h<", "<TimeFormat>24H<")
+        self.assert_found("TimeFormat '24H': not one of 12h, 24h")
+
+    def test_a_text_that_is_cut(self):
+        self.replace("<VoicemailName>Messagerie<", f"<VoicemailName>{'M' * 200}<")
+        self.assert_found("200 bytes, 199 are kept")
+
     def test_a_count_that_does_not_count(self):
         self.replace("<NbSubsetLock>2", "<NbSubsetLock>3")
         self.assert_found("NbSubsetLock says 3, there are 2 SubsetLock")
