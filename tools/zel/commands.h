@@ -1,0 +1,39 @@
+#pragma once
+// The functions behind the command table's rows, one file per topic.
+
+#include "invocation.h"
+
+namespace zel_command {
+
+// runs.cpp
+int install(Invocation &invocation);
+int upgrade(Invocation &invocation);
+int boot(Invocation &invocation);
+int imei(Invocation &invocation);
+int factory_reset(Invocation &invocation);
+int reboot(Invocation &invocation);
+
+// queries.cpp
+int customers(Invocation &invocation);
+int version(Invocation &invocation);
+int approval(Invocation &invocation);
+
+// log.cpp
+int log(Invocation &invocation);
+
+// summary.cpp
+int summary(Invocation &invocation);
+
+// vconf.cpp
+int vconf_get(Invocation &invocation);
+int vconf_set(Invocation &invocation);
+int vconf_unset(Invocation &invocation);
+int vconf_list(Invocation &invocation);
+
+// phone-verbs.cpp
+int phone_verb(Invocation &invocation);
+
+// completion.cpp
+int completion_bash(Invocation &invocation);
+
+} // namespace zel_command

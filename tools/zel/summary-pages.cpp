@@ -1,0 +1,87 @@
+#include "summary-parts.h"
+
+#include "secrets.h"
+
+namespace zel_command {
+namespace {
+
+void print_title(const std::string &title) { print_line("\n" + title); }
+
+std::string or_dash(const std::string &text) { return text.empty() ? "-" : text; }
+
+void print_customer(const Json &customer) {
+    const std::string code = bytes_of(customer, "code");
+    const std::string folder = bytes_of(customer, "folder");
+    print_line("Customer");
+    print_table({}, {{"  Active customer", or_dash(code) + (folder == code ? "" : " (folder " + folder + ")")},
+                     {"  Configured", customer.value("configured", false) ? "yes" : "no"},
+                     {"  Package", or_dash(bytes_of(customer, "package"))},
+                     {"  Country", or_dash(bytes_of(customer, "country"))},
+                     {"  Language", or_dash(bytes_of(customer, "language"))}});
+}
+
+void print_auto_flags(const Json &flags) {
+    std::string on;
+    if (flags.is_object())
+        for (const auto &[name, value] : flags.items())
+            if (value == true) on += (on.empty() ? "" : ", ") + name;
+    if (on.empty()) on = "none";
+    print_title("Decided by the SIM card (Auto flags)");
+    print_line("  " + (flags.is_object() ? on : std::string{"unknown: the customer's file cannot be read"}));
+}
+
+void print_settings(const Json &settings) {
+    std::vector<std::vector<std::string>> rows;
+    for (const Json &row : settings) {
+        const std::string value = bytes_of(row, "value");
+        rows.push_back({"  " + bytes_of(row, "name"), is_secret(bytes_of(row, "key")) ? masked(value) : value});
+    }
+    print_title("Settings");
+    print_table({}, rows);
+}
+
+void print_networks(const Json &sims) {
+    for (const Json &sim : sims) {
+        std::vector<std::vector<std::string>> rows;
+        for (const Json &network : sim["networks"]) {
+            rows.push_back({"  " + bytes_of(network, "name"), bytes_of(network, "mccmnc")});
+            for (const Json &profile : network["profiles"])
+                rows.push_back({"    " + bytes_of(profile, "name"), bytes_of(profile, "apn"),
+                                bytes_of(profile, "service"), profile.value("default", false) ? "default" : ""});
+        }
+        if (rows.empty()) continue;
+        print_title("Networks and their profiles, SIM " + sim["sim"].dump());
+        print_table({}, rows);
+    }
+}
+
+void print_media(const Json &folders) {
+    std::vector<std::vector<std::string>> rows;
+    for (const Json &folder : folders)
+        for (const Json &file : folder["files"])
+            rows.push_back({"  " + bytes_of(folder, "folder") + "/" + bytes_of(file, "name"), file["size"].dump()});
+    if (rows.empty()) return;
+    print_title("Media files, with their sizes");
+    print_table({}, rows);
+}
+
+void print_section_store(const Json &files) {
+    std::vector<std::vector<std::string>> rows;
+    for (const Json &file : files)
+        if (file.value("size", 0) > 0) rows.push_back({"  " + bytes_of(file, "name"), file["size"].dump()});
+    print_title("Recorded customer defaults (/opt/system/zel-default/data), with their sizes");
+    print_table({}, rows);
+}
+
+} // namespace
+
+void print_summary(const Json &summary) {
+    print_customer(summary["customer"]);
+    print_auto_flags(summary["auto_flags"]);
+    print_settings(summary["settings"]);
+    print_networks(summary["sims"]);
+    print_media(summary["media"]);
+    print_section_store(summary["section_store"]);
+}
+
+} // namespace zel_command
