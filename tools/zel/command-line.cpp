@@ -6,6 +6,7 @@
 
 #include <CLI/CLI.hpp>
 
+#include <algorithm>
 #include <deque>
 
 namespace zel_command {
@@ -23,6 +24,15 @@ struct Slot {
 std::string spelling_of(const Parameter &parameter) {
     if (parameter.form == Parameter::Form::kOption) return "--" + parameter.name;
     return parameter.argument.empty() ? parameter.name : parameter.name + ",--" + parameter.argument;
+}
+
+// The parser only says that a command is required; the user wants to know which word was none.
+std::string unknown_word(const std::string &group, const CLI::App &top) {
+    const std::vector<std::string> rest = top.remaining(true);
+    const auto word = std::find_if(rest.begin(), rest.end(),
+                                   [](const std::string &text) { return !text.empty() && text.front() != '-'; });
+    if (word != rest.end()) return "there is no command '" + group + *word + "'";
+    return group.empty() ? "no command is given" : "'" + group.substr(0, group.size() - 1) + "' needs a verb";
 }
 
 class Grammar {
@@ -91,11 +101,17 @@ void Grammar::add_parameter(CLI::App &app, const Command &command, const Paramet
 }
 
 int Grammar::usage_error(const CLI::ParseError &error) {
-    std::string command = "zel";
+    std::string place = "zel";
+    std::string message = app_.get_subcommands().empty() ? unknown_word({}, app_) : error.what();
+    for (const auto &[group, app] : groups_) {
+        if (!app->parsed()) continue;
+        place = "zel " + group;
+        if (app->get_subcommands().empty()) message = unknown_word(group + " ", app_);
+    }
     for (const auto &[app, row] : rows_)
-        if (app->parsed()) command = "zel " + row->name;
-    report(escaped_line(error.what()));
-    report_plain("See '" + command + " --help'.");
+        if (app->parsed()) place = "zel " + row->name;
+    report(escaped_line(message));
+    report_plain("See '" + place + " --help'.");
     return kUsage;
 }
 
