@@ -16,7 +16,8 @@ struct FreeText {
 
 void copy_label(const char *source, const char *target) {
     char *label = nullptr;
-    if (smack_lgetlabel(source, &label) != 0) return;
+    // The label call does not follow links, but what is copied is the file behind them.
+    if (smack_lgetlabel(zel_svc_file_behind_links(source).c_str(), &label) != 0) return;
     const std::unique_ptr<char, FreeText> owned{label};
     if (owned) security_server_label_access(target, owned.get());
 }
@@ -42,7 +43,8 @@ void zel_svc_file_copy_attr(int source_fd, const char *source, int target_fd, co
     uid_t uid = 0;
     gid_t gid = 0;
     if (zel_platform_get_owner(source_fd, &uid, &gid) == 0) zel_platform_set_owner(target_fd, uid, gid);
+    copy_label(source, target);
+    // The mode comes last: a change of owner drops set-id bits, and a read-only file takes no label.
     struct stat status = {};
     if (::fstat(source_fd, &status) == 0) ::fchmod(target_fd, status.st_mode & 07777U);
-    copy_label(source, target);
 }

@@ -21,29 +21,12 @@ struct Target {
     std::string created;
 };
 
-// Where a link, or a chain of them, leads; the path itself when no link stands there.
-std::string behind_links(std::string path) {
-    constexpr int kMostLinks = 40;
-    for (int i = 0; i < kMostLinks; ++i) {
-        char name[ZEL_PLATFORM_NAME_MAX];
-        std::array<char, 4096> link;
-        const ZelSvcFd folder{zel_platform_open_parent(path.c_str(), name)};
-        const ssize_t size = folder ? ::readlinkat(folder.get(), name, link.data(), link.size()) : -1;
-        if (size <= 0) break;
-        const std::string_view text{link.data(), static_cast<std::size_t>(size)};
-        if (text.front() == '/') path.clear();
-        path.resize(path.rfind('/') + 1); // from the end of an empty path to its start
-        path.append(text);
-    }
-    return path;
-}
-
 // Leaves what the file holds alone: it may turn out to be the source under another name.
 Target open_target(const char *path) {
     if (ZelSvcFd existing = zel_svc_file_open(path, O_WRONLY)) return {.fd = std::move(existing), .created = {}};
     if (errno != ENOENT) return {};
     // A link that names nothing yet is no reason to fail: the file appears where the link says.
-    std::string created = behind_links(path);
+    std::string created = zel_svc_file_behind_links(path);
     ZelSvcFd fresh = zel_svc_file_open(created.c_str(), O_WRONLY | O_CREAT | O_EXCL, 0644);
     return {.fd = std::move(fresh), .created = std::move(created)};
 }

@@ -4,6 +4,7 @@
 
 #include <zel-platform.h>
 
+#include <array>
 #include <cerrno>
 #include <fcntl.h>
 #include <sys/stat.h>
@@ -61,6 +62,22 @@ int zel_svc_file_remove(const char *path) {
     char name[ZEL_PLATFORM_NAME_MAX];
     const ZelSvcFd folder{zel_platform_open_parent(path, name)};
     return folder ? ::unlinkat(folder.get(), name, 0) : -1;
+}
+
+std::string zel_svc_file_behind_links(std::string path) {
+    constexpr int kMostLinks = 40;
+    for (int i = 0; i < kMostLinks; ++i) {
+        char name[ZEL_PLATFORM_NAME_MAX];
+        std::array<char, 4096> link;
+        const ZelSvcFd folder{zel_platform_open_parent(path.c_str(), name)};
+        const ssize_t size = folder ? ::readlinkat(folder.get(), name, link.data(), link.size()) : -1;
+        if (size <= 0) break;
+        const std::string_view text{link.data(), static_cast<std::size_t>(size)};
+        if (text.front() == '/') path.clear();
+        path.resize(path.rfind('/') + 1); // from the end of an empty path to its start
+        path.append(text);
+    }
+    return path;
 }
 
 int __zel_svc_config_file_exists(const char *path) { return zel_svc_file_open_any(path) ? 1 : 0; }
