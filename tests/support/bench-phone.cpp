@@ -123,7 +123,8 @@ std::string BenchPhone::run_log() { return exists(kRunLog) ? read(kRunLog) : std
 
 std::vector<std::string> BenchPhone::system_log() {
     std::vector<std::string> messages;
-    for (const json &line : call("log").at("lines"))
+    const json log = call("log"); // the loop needs it to the end
+    for (const json &line : log.at("lines"))
         messages.push_back(line.at("message").get<std::string>());
     return messages;
 }

@@ -185,37 +185,56 @@ TEST_F(DataFile, OfEveryGroupIsLoadedBack) {
     EXPECT_EQ(tree("/opt/system/zel-default/data").size(), 27U);
 }
 
-class LoadedBack : public DataFile, public ::testing::WithParamInterface<std::pair<std::string, std::string>> {};
+struct StoredString {
+    const char *name; // of the test
+    std::string value;
+    std::string loaded;
+};
 
-TEST_P(LoadedBack, AStringIsWhatItWasAlsoAfterASecondDump) {
-    const auto &[value, expected] = GetParam();
+class LoadedBack : public DataFile, public ::testing::WithParamInterface<StoredString> {};
+
+TEST_P(LoadedBack, AStringIsWhatItWasAlsoAfterMoreDumps) {
+    const StoredString &stored = GetParam();
     zel_svc_data_load(kGps, 0, 1);
-    zel_svc_data_set_str(kGps, "gps", "k", value);
+    zel_svc_data_set_str(kGps, "gps", "k", stored.value);
     zel_svc_data_set_int(kGps, "gps", "next", 5);
-    EXPECT_EQ(zel_svc_data_get_text(kGps, "gps", "k"), expected);
+    EXPECT_EQ(zel_svc_data_get_text(kGps, "gps", "k"), stored.loaded);
     for (int i = 0; i < 3; ++i) {
         dump_and_load();
-        EXPECT_EQ(text("gps", "k"), expected) << "dump " << i;
-        EXPECT_EQ(zel_svc_data_get_text(kGps, "gps", "k"), expected);
+        EXPECT_EQ(text("gps", "k"), stored.loaded) << "dump " << i;
+        EXPECT_EQ(zel_svc_data_get_text(kGps, "gps", "k"), stored.loaded);
         EXPECT_EQ(zel_svc_data_get_int(kGps, "gps", "next", 7), 5);
     }
 }
 
-INSTANTIATE_TEST_SUITE_P(Strings, LoadedBack,
-                         ::testing::Values(std::pair{"plain", "plain"}, std::pair{"", ""},
-                                           std::pair{" blanks at both ends ", " blanks at both ends "},
-                                           std::pair{"a # b ; c = d", "a # b ; c = d"},
-                                           std::pair{"[section]", "[section]"}, std::pair{"back\\", "back\\"},
-                                           std::pair{"it's", "it's"}, std::pair{"'", "'"}, std::pair{"\"", "\""},
-                                           std::pair{"say \"yes\"", "say \"yes\""}, std::pair{"\"all\"", "\"all\""},
-                                           std::pair{"'all'", "'all'"}, std::pair{"\"it's\"", "'it's'"},
-                                           std::pair{"a\nb", "a b"}, std::pair{"\n[x]\ny = 1\n", " [x] y = 1 "},
-                                           std::pair{"\r\t\x01\x7f", "\r\t\x01\x7f"},
-                                           std::pair{"\xff\xfe\xc3", "\xff\xfe\xc3"},
-                                           std::pair{"\xe2\x82\xac \xf0\x9f\x93\xb1", "\xe2\x82\xac \xf0\x9f\x93\xb1"},
-                                           std::pair{"007", "007"}, std::pair{"-5", "-5"}, std::pair{"%s%n", "%s%n"},
-                                           std::pair{std::string(300, '"'), std::string(255, '"')},
-                                           std::pair{std::string(300, ';'), std::string(255, ';')}));
+const StoredString kStoredStrings[] = {
+    {"Plain", "plain", "plain"},
+    {"Empty", "", ""},
+    {"BlanksAtBothEnds", "  a ", "  a "},
+    {"CommentSigns", "a # b ; c = d", "a # b ; c = d"},
+    {"SectionHeader", "[section]", "[section]"},
+    {"TrailingBackslash", "back\\", "back\\"},
+    {"Apostrophe", "it's", "it's"},
+    {"OnlyASingleQuote", "'", "'"},
+    {"OnlyADoubleQuote", "\"", "\""},
+    {"DoubleQuotesInside", "say \"yes\"", "say \"yes\""},
+    {"DoubleQuotesAround", "\"all\"", "\"all\""},
+    {"SingleQuotesAround", "'all'", "'all'"},
+    {"BothKindsOfQuotes", "\"it's\"", "'it's'"},
+    {"LineFeed", "a\nb", "a b"},
+    {"LineFeedsThatWouldBeEntries", "\n[x]\ny = 1\n", " [x] y = 1 "},
+    {"ControlBytes", "\r\t\x01\x7f", "\r\t\x01\x7f"},
+    {"NoUtf8", "\xff\xfe\xc3", "\xff\xfe\xc3"},
+    {"Utf8", "\xe2\x82\xac \xf0\x9f\x93\xb1", "\xe2\x82\xac \xf0\x9f\x93\xb1"},
+    {"LeadingZeros", "007", "007"},
+    {"Negative", "-5", "-5"},
+    {"FormatLetters", "%s%n", "%s%n"},
+    {"TooLong", std::string(300, ';'), std::string(255, ';')},
+    {"TooManyQuotes", std::string(300, '"'), std::string(255, '"')},
+};
+
+INSTANTIATE_TEST_SUITE_P(String, LoadedBack, ::testing::ValuesIn(kStoredStrings),
+                         [](const auto &test) { return std::string{test.param.name}; });
 
 TEST_F(DataFile, LoadsBackTheLongestNamesAndValues) {
     const std::string section(50, 's');

@@ -121,31 +121,45 @@ TEST_F(Ini, TellsThatADumpFellShort) {
     EXPECT_FALSE(ini.dump(out.get()));
 }
 
-class IniQuoted : public FilesPhone, public ::testing::WithParamInterface<std::pair<const char *, const char *>> {};
-
-TEST_P(IniQuoted, WrapsAValueSoThatItLoadsBack) { EXPECT_EQ(zel_svc_ini_quoted(GetParam().first), GetParam().second); }
-
-INSTANTIATE_TEST_SUITE_P(Values, IniQuoted,
-                         ::testing::Values(std::pair{"", ""}, std::pair{"a", "\"a\""}, std::pair{" ", "\" \""},
-                                           std::pair{"it's", "\"it's\""}, std::pair{"5\"", "'5\"'"},
-                                           std::pair{"\"a\" 'b'", "\"'a' 'b'\""}, std::pair{"a\nb\n", "\"a b \""},
-                                           std::pair{"\n", "\" \""}, std::pair{"\\", "\"\\\""}));
-
-class IniNumber : public FilesPhone, public ::testing::WithParamInterface<std::pair<const char *, int>> {};
-
-// The library's own getter is the measure, on a value that a file can hold.
-TEST_P(IniNumber, IsReadAsByTheLibrary) {
-    const auto &[text, number] = GetParam();
-    EXPECT_EQ(zel_svc_ini_number(text), number);
-    write("/opt/t/file.ini", "[a]\nb = " + std::string{text} + "\n");
-    EXPECT_EQ(ZelSvcIni::load("/opt/t/file.ini").number("a:b", 77), number);
+TEST(IniQuoted, WrapsAValueSoThatItLoadsBack) {
+    EXPECT_EQ(zel_svc_ini_quoted("a"), "\"a\"");
+    EXPECT_EQ(zel_svc_ini_quoted(" "), "\" \"");
+    EXPECT_EQ(zel_svc_ini_quoted("it's"), "\"it's\"");
+    EXPECT_EQ(zel_svc_ini_quoted("\\"), "\"\\\"");
 }
 
-INSTANTIATE_TEST_SUITE_P(Values, IniNumber,
-                         ::testing::Values(std::pair{"7", 7}, std::pair{"-7", -7}, std::pair{"0x10", 16},
-                                           std::pair{"010", 8}, std::pair{"08", 0}, std::pair{"", 0},
-                                           std::pair{"abc", 0}, std::pair{"12abc", 12},
-                                           std::pair{"2147483647", 2147483647},
-                                           std::pair{"-2147483648", -2147483647 - 1}));
+TEST(IniQuoted, LeavesAnEmptyValueWithoutQuotes) { EXPECT_EQ(zel_svc_ini_quoted(""), ""); }
+
+TEST(IniQuoted, WrapsADoubleQuoteInSingleOnes) { EXPECT_EQ(zel_svc_ini_quoted("5\""), "'5\"'"); }
+
+TEST(IniQuoted, TurnsDoubleQuotesIntoSingleOnesWhereBothStand) {
+    EXPECT_EQ(zel_svc_ini_quoted("\"a\" 'b'"), "\"'a' 'b'\"");
+}
+
+TEST(IniQuoted, TurnsLineFeedsIntoBlanks) {
+    EXPECT_EQ(zel_svc_ini_quoted("a\nb\n"), "\"a b \"");
+    EXPECT_EQ(zel_svc_ini_quoted("\n"), "\" \"");
+}
+
+// The library's own getter is the measure, on a value that a file can hold.
+TEST_F(Ini, NumbersOutsideItAreReadAsInIt) {
+    const std::pair<const char *, int> numbers[] = {
+        {"7", 7},
+        {"-7", -7},
+        {"0x10", 16},
+        {"010", 8},
+        {"08", 0},
+        {"", 0},
+        {"abc", 0},
+        {"12abc", 12},
+        {"2147483647", 2147483647},
+        {"-2147483648", -2147483647 - 1},
+    };
+    for (const auto &[text, number] : numbers) {
+        EXPECT_EQ(loaded("[a]\nb = " + std::string{text} + "\n").number("a:b", 77), number) << text;
+        EXPECT_EQ(zel_svc_ini_number(text), number) << text;
+    }
+    EXPECT_EQ(zel_svc_ini_number("\"5\""), 0) << "quotes of this run are part of the value";
+}
 
 } // namespace
