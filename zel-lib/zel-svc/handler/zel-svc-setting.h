@@ -95,12 +95,12 @@ using SettingStep = void (*)(const Setting &, Occurrence &);
 
 struct Setting {
     ZelSvcElementId element;
+    ZelSvcAutoFlag auto_flag = ZEL_SVC_AUTO_NEVER; // verified only while this flag is not 1
     Accepts accepts = any_text();
     Store stores[3]; // unused places are empty
     Record records[3];
     Report report = no_report();
     Export exports = never();
-    ZelSvcAutoFlag auto_flag = ZEL_SVC_AUTO_NEVER; // verified only while this flag is not 1
     // Odd steps, each in place of the engine's. Install and verify steps get accepted texts only.
     SettingStep install = nullptr;
     SettingStep verify = nullptr;
