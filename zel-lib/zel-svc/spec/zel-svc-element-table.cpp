@@ -358,6 +358,7 @@ extern constexpr std::array<ZelSvcElement, ZEL_SVC_ELEMENT_COUNT> kZelSvcElement
 // clang-format on
 
 extern constexpr ZelSvcParseBegin kZelSvcParseBegins[] = {
+    zel_svc_element_act_network_info_begin_parse,
     nullptr,
 };
 
