@@ -145,8 +145,8 @@ TEST_F(Language, UnreadableFlagFallsBackToTheLanguage) {
 
 TEST_F(Language, UnreadableLanguageFails) {
     EXPECT_THAT(verify_spec(language("english_us") + no_sim("english_us")),
-                ElementsAre(failed("[Phone/DefLanguage] Spec='english_us',Phone='??'"),
-                            failed("[Phone/DefLanguageNoSIM] Spec='english_us',Phone='??'")));
+                ElementsAre(failed("[Phone/DefLanguage] Spec='english_us',Phone='?\?'"),
+                            failed("[Phone/DefLanguageNoSIM] Spec='english_us',Phone='?\?'")));
 }
 
 TEST_F(Language, UnknownWordAddsNoLine) {

@@ -121,7 +121,7 @@ TEST_F(AutoFlags, OnlyAFullInstallDecidesSimAutoSetting) {
 TEST_F(AutoFlags, PacketSwitchOfFiveFails) {
     set_int("db/zel/network/ps_auto_attach", 5);
     EXPECT_THAT(verify_spec(network(leaf("AutoAttach", "on"))),
-                ElementsAre(failed("[Network/AutoAttach] Spec='on',Phone='??'")));
+                ElementsAre(failed("[Network/AutoAttach] Spec='on',Phone='?\?'")));
 }
 
 } // namespace zel_test
