@@ -67,21 +67,26 @@ bool write_product_code(int fd, std::string_view code) {
     return seek_product_code(fd) && zel_svc_file_write_all(fd, code.substr(0, kCodeLength));
 }
 
+void tell_product_code_changed(bool changed, const CodeBytes &old, const std::string &code) {
+    if (changed)
+        zel_svc_run_log("[SetActCustomerName/Success] Product code changed('%s'->'%s') into csa.\n", old.data(),
+                        code.c_str());
+    else
+        zel_svc_run_log("[SetActCustomerName/Error!!] Product code in csa not updated.\n");
+}
+
 // A code longer than the three bytes never equals them, so its first three are written each time.
 void update_product_code(int fd, const std::string &code) {
-    if (!seek_product_code(fd)) return;
     CodeBytes old;
+    if (!seek_product_code(fd)) return;
     if (!read_code(fd, old))
-        zel_svc_run_log("[SetActCustomerName/Error!!] Product code in csa not updated.\n");
+        tell_product_code_changed(false, old, code);
     else if (std::string_view{old.data(), kCodeLength} == code)
         zel_svc_run_log("[SetActCustomerName] Product code already changed('%s') into csa.\n", code.c_str());
     else if (old[0] == '\0' || code.size() < kCodeLength)
         zel_svc_run_log("[SetActCustomerName/Error!!] Product code in csa error.\n");
-    else if (!write_product_code(fd, code))
-        zel_svc_run_log("[SetActCustomerName/Error!!] Product code in csa not updated.\n");
     else
-        zel_svc_run_log("[SetActCustomerName/Success] Product code changed('%s'->'%s') into csa.\n", old.data(),
-                        code.c_str());
+        tell_product_code_changed(write_product_code(fd, code), old, code);
 }
 
 void store_in_product_code(const std::string &code) {

@@ -363,14 +363,6 @@ constexpr auto kOperatorRows = std::to_array<ZelSvcOperatorRow>({
 });
 // clang-format on
 
-constexpr bool codes_are_unique() {
-    for (std::size_t row = 0; row < kOperatorRows.size(); ++row)
-        for (std::size_t other = row + 1; other < kOperatorRows.size(); ++other)
-            if (kOperatorRows[row].code == kOperatorRows[other].code) return false;
-    return true;
-}
-static_assert(codes_are_unique(), "a second row of a code would never be found");
-
 } // namespace
 
 const ZelSvcOperatorRow &zel_svc_operator_row(std::string_view code) {
