@@ -1,0 +1,208 @@
+#include "service-phone.h"
+
+#include <cstring>
+
+namespace {
+
+ZelSvcSimOperator some_operator() {
+    ZelSvcSimOperator entry = {};
+    std::strcpy(entry.customer_name, "XFV");
+    std::strcpy(entry.network_name, "Vodacom");
+    std::strcpy(entry.mccmnc, "65501");
+    std::strcpy(entry.subset_code, "12");
+    std::strcpy(entry.gid, "FF");
+    std::strcpy(entry.sp_name, "Vodacom SA");
+    return entry;
+}
+
+class ActiveOperator : public zel_test::ServicePhone {
+  protected:
+    const ZelSvcSimOperator entry_ = some_operator();
+    ZelSvcSimOperator read_ = {};
+};
+
+} // namespace
+
+TEST_F(ActiveOperator, OfTheFirstSlotIsInSixKeys) {
+    EXPECT_EQ(zel_svc_sim_auto_setting_set_active_operator(&entry_, 1), 1);
+    EXPECT_EQ(get_string("db/private/zel/sim_auto_op_customer_name"), "XFV");
+    EXPECT_EQ(get_string("db/private/zel/sim_auto_op_network_name"), "Vodacom");
+    EXPECT_EQ(get_string("db/private/zel/sim_auto_op_mcc_mnc"), "65501");
+    EXPECT_EQ(get_string("db/private/zel/sim_auto_op_subset_code"), "12");
+    EXPECT_EQ(get_string("db/private/zel/sim_auto_op_sp_code"), "FF");
+    EXPECT_EQ(get_string("db/private/zel/sim_auto_op_sp_name"), "Vodacom SA");
+    EXPECT_EQ(get_string("db/private/zel/sim2/sim_auto_op_network_name"), std::nullopt);
+    EXPECT_TRUE(system_logged("vconf_set_str(ZelSimAutoOpCustomerName,'XFV') succeeded."));
+    EXPECT_TRUE(system_logged("vconf_set_str(ZelSimAutoOpNetName,'Vodacom') succeeded."));
+    EXPECT_TRUE(system_logged("Setting active operator(vconf) succeeded."));
+    EXPECT_EQ(system_log().size(), 3U);
+}
+
+TEST_F(ActiveOperator, OfTheSecondSlotSharesTheCustomersName) {
+    EXPECT_EQ(zel_svc_sim_auto_setting_set_active_operator(&entry_, 2), 1);
+    EXPECT_EQ(get_string("db/private/zel/sim_auto_op_customer_name"), "XFV");
+    EXPECT_EQ(get_string("db/private/zel/sim2/sim_auto_op_network_name"), "Vodacom");
+    EXPECT_EQ(get_string("db/private/zel/sim2/sim_auto_op_mcc_mnc"), "65501");
+    EXPECT_EQ(get_string("db/private/zel/sim2/sim_auto_op_subset_code"), "12");
+    EXPECT_EQ(get_string("db/private/zel/sim2/sim_auto_op_sp_code"), "FF");
+    EXPECT_EQ(get_string("db/private/zel/sim2/sim_auto_op_sp_name"), "Vodacom SA");
+    EXPECT_EQ(get_string("db/private/zel/sim_auto_op_network_name"), std::nullopt);
+    EXPECT_TRUE(system_logged("vconf_set_str(ZelSim2AutoOpNetName,'Vodacom') succeeded."));
+}
+
+TEST_F(ActiveOperator, AnyOtherSlotIsTheFirst) {
+    EXPECT_EQ(zel_svc_sim_auto_setting_set_active_operator(&entry_, 0), 1);
+    EXPECT_EQ(zel_svc_sim_auto_setting_get_active_operator(&read_, 7), 1);
+    EXPECT_STREQ(read_.network_name, "Vodacom");
+}
+
+TEST_F(ActiveOperator, ComesBackAsItWasStored) {
+    zel_svc_sim_auto_setting_set_active_operator(&entry_, 2);
+    EXPECT_EQ(zel_svc_sim_auto_setting_get_active_operator(&read_, 2), 1);
+    EXPECT_EQ(std::memcmp(&read_, &entry_, sizeof read_), 0);
+}
+
+TEST_F(ActiveOperator, TheServiceProvidersNameIsReadUpTo14Bytes) {
+    ZelSvcSimOperator entry = entry_;
+    std::strcpy(entry.sp_name, "1234567890123456789");
+    zel_svc_sim_auto_setting_set_active_operator(&entry, 1);
+    EXPECT_EQ(get_string("db/private/zel/sim_auto_op_sp_name"), "1234567890123456789");
+    zel_svc_sim_auto_setting_get_active_operator(&read_, 1);
+    EXPECT_STREQ(read_.sp_name, "12345678901234");
+}
+
+TEST_F(ActiveOperator, ALongStoredTextIsCutToItsField) {
+    set_string("db/private/zel/sim_auto_op_mcc_mnc", "123456789012");
+    zel_svc_sim_auto_setting_get_active_operator(&read_, 1);
+    EXPECT_STREQ(read_.mccmnc, "123456789");
+}
+
+TEST_F(ActiveOperator, AMissingKeyMakesTheResult0AndFillsTheRest) {
+    zel_svc_sim_auto_setting_set_active_operator(&entry_, 1);
+    call("vconf-unset", {{"key", "db/private/zel/sim_auto_op_mcc_mnc"}});
+    std::memset(&read_, 'x', sizeof read_);
+    EXPECT_EQ(zel_svc_sim_auto_setting_get_active_operator(&read_, 1), 0);
+    EXPECT_STREQ(read_.network_name, "Vodacom");
+    EXPECT_STREQ(read_.mccmnc, "");
+    EXPECT_STREQ(read_.sp_name, "Vodacom SA");
+}
+
+TEST_F(ActiveOperator, WithoutARecordItTellsWhetherAllKeysExist) {
+    EXPECT_EQ(zel_svc_sim_auto_setting_get_active_operator(nullptr, 1), 0);
+    zel_svc_sim_auto_setting_set_active_operator(&entry_, 1);
+    EXPECT_EQ(zel_svc_sim_auto_setting_get_active_operator(nullptr, 1), 1);
+    EXPECT_EQ(zel_svc_sim_auto_setting_get_active_operator(nullptr, 2), 0);
+}
+
+TEST_F(ActiveOperator, AnEmptyCustomerNameLeavesTheStoredOne) {
+    zel_svc_sim_auto_setting_set_active_operator(&entry_, 1);
+    const ZelSvcSimOperator nobody = {};
+    EXPECT_EQ(zel_svc_sim_auto_setting_set_active_operator(&nobody, 1), 1);
+    EXPECT_EQ(get_string("db/private/zel/sim_auto_op_customer_name"), "XFV");
+    EXPECT_EQ(get_string("db/private/zel/sim_auto_op_network_name"), "");
+    EXPECT_TRUE(system_logged("vconf_set_str(ZelSimAutoOpNetName,'') succeeded."));
+}
+
+TEST_F(ActiveOperator, NullIsNotStored) { EXPECT_EQ(zel_svc_sim_auto_setting_set_active_operator(nullptr, 1), 0); }
+
+struct RefusedWrite {
+    int slot;
+    const char *key;
+    const char *message;
+};
+
+class ActiveOperatorRefused : public ActiveOperator, public ::testing::WithParamInterface<RefusedWrite> {};
+
+TEST_P(ActiveOperatorRefused, IsLoggedAndTheOthersAreStillWritten) {
+    fail("vconf_set_str", GetParam().key, 1, -1, -7);
+    EXPECT_EQ(zel_svc_sim_auto_setting_set_active_operator(&entry_, GetParam().slot), 0);
+    EXPECT_TRUE(system_logged(GetParam().message));
+    EXPECT_TRUE(system_logged("Setting active operator(vconf) failed."));
+    EXPECT_EQ(get_string(GetParam().key), std::nullopt);
+    EXPECT_EQ(call("vconf-list", {{"prefix", "db/private/zel/"}}).at("keys").size(), 5U);
+}
+
+INSTANTIATE_TEST_SUITE_P(
+    EveryKey, ActiveOperatorRefused,
+    ::testing::Values(
+        RefusedWrite{1, "db/private/zel/sim_auto_op_customer_name",
+                     "vconf_set_str(ZelSimAutoOpCustomerName,'XFV')=-7 failed."},
+        RefusedWrite{1, "db/private/zel/sim_auto_op_network_name",
+                     "vconf_set_str(ZelSimAutoOpNetName,'Vodacom')=-7 failed."},
+        RefusedWrite{1, "db/private/zel/sim_auto_op_mcc_mnc", "vconf_set_str(ZelSimOpMccMnc)=-7 failed."},
+        RefusedWrite{1, "db/private/zel/sim_auto_op_subset_code", "vconf_set_str(ZelSimAutoOpSubSetCode)=-7 failed."},
+        RefusedWrite{1, "db/private/zel/sim_auto_op_sp_code", "vconf_set_str(ZelSimAutoOpSpCode)=-7 failed."},
+        RefusedWrite{1, "db/private/zel/sim_auto_op_sp_name", "vconf_set_str(ZelSimAutoOpSpName)=-7 failed."},
+        RefusedWrite{2, "db/private/zel/sim2/sim_auto_op_network_name",
+                     "vconf_set_str(ZelSim2AutoOpNetName,'Vodacom')=-7 failed."},
+        RefusedWrite{2, "db/private/zel/sim2/sim_auto_op_mcc_mnc", "vconf_set_str(ZelSim2AutoOpMccMnc)=-7 failed."},
+        RefusedWrite{2, "db/private/zel/sim2/sim_auto_op_subset_code",
+                     "vconf_set_str(ZelSim2AutoOpSubSetCode)=-7 failed."},
+        RefusedWrite{2, "db/private/zel/sim2/sim_auto_op_sp_code", "vconf_set_str(ZelSim2AutoOpSpCode)=-7 failed."},
+        RefusedWrite{2, "db/private/zel/sim2/sim_auto_op_sp_name", "vconf_set_str(ZelSim2AutoOpSpName)=-7 failed."}));
+
+class ClearActiveOperator : public ActiveOperator {
+  protected:
+    void SetUp() override {
+        ActiveOperator::SetUp();
+        zel_svc_sim_auto_setting_set_active_operator(&entry_, 1);
+        zel_svc_sim_auto_setting_set_active_operator(&entry_, 2);
+        for (const char *key : {"db/private/zel/sim_mcc_mnc", "db/private/zel/sim_msin",
+                                "db/private/zel/sim2/sim_mcc_mnc", "db/private/zel/sim2/sim_msin"})
+            set_string(key, "12345");
+        set_int("db/private/zel/sim_selection_show", 1);
+        set_int("db/private/zel/sim2/sim_selection_show", 1);
+        set_bool("memory/private/zel/sim_changed", true);
+        set_bool("memory/private/zel/sim2/sim_changed", true);
+    }
+
+    void expect_cleared_but(const std::string &kept) {
+        for (const nlohmann::json &key : call("vconf-list", {{"prefix", "db/private/zel/"}}).at("keys"))
+            if (key.at("key") != kept && key.at("key") != "db/private/zel/sim_auto_op_customer_name")
+                EXPECT_TRUE(key.at("value") == "" || key.at("value") == 0) << key;
+        for (const char *key : {"memory/private/zel/sim_changed", "memory/private/zel/sim2/sim_changed"})
+            if (key != kept) EXPECT_EQ(get_bool(key), false) << key;
+    }
+};
+
+TEST_F(ClearActiveOperator, LeavesOnlyTheCustomersName) {
+    EXPECT_EQ(zel_svc_sim_auto_setting_clear_active_operator(), 1);
+    EXPECT_EQ(get_string("db/private/zel/sim_auto_op_customer_name"), "XFV");
+    expect_cleared_but("");
+    EXPECT_EQ(system_log().back().substr(system_log().back().find("> ")),
+              "> Clearing active operator(vconf) succeeded.");
+}
+
+struct RefusedClear {
+    const char *function;
+    const char *key;
+    const char *message; // null: none of its own
+};
+
+class ClearActiveOperatorRefused : public ClearActiveOperator, public ::testing::WithParamInterface<RefusedClear> {};
+
+TEST_P(ClearActiveOperatorRefused, MakesTheResult0AndClearsTheRest) {
+    fail(GetParam().function, GetParam().key, 1, -1, -3);
+    EXPECT_EQ(zel_svc_sim_auto_setting_clear_active_operator(), 0);
+    if (GetParam().message) EXPECT_TRUE(system_logged(GetParam().message));
+    EXPECT_TRUE(system_logged("Clearing active operator(vconf) failed."));
+    expect_cleared_but(GetParam().key);
+}
+
+INSTANTIATE_TEST_SUITE_P(
+    EveryKey, ClearActiveOperatorRefused,
+    ::testing::Values(
+        RefusedClear{"vconf_set_str", "db/private/zel/sim_auto_op_network_name",
+                     "vconf_set_str(ZelSimAutoOpNetName,'')=-3 failed."},
+        RefusedClear{"vconf_set_str", "db/private/zel/sim2/sim_auto_op_sp_name",
+                     "vconf_set_str(ZelSim2AutoOpSpName)=-3 failed."},
+        RefusedClear{"vconf_set_int", "db/private/zel/sim_selection_show",
+                     "vconf_set_int(ZelSimSelectionShow,0)=-3 failed."},
+        RefusedClear{"vconf_set_int", "db/private/zel/sim2/sim_selection_show",
+                     "vconf_set_int(ZelSim2SelectionShow,0)=-3 failed."},
+        RefusedClear{"vconf_set_str", "db/private/zel/sim_mcc_mnc", "vconf_set_str(ZelSimMccMnc,'')=-3 failed."},
+        RefusedClear{"vconf_set_str", "db/private/zel/sim_msin", "vconf_set_str(ZelSimMsin,'')=-3 failed."},
+        RefusedClear{"vconf_set_str", "db/private/zel/sim2/sim_mcc_mnc", "vconf_set_str(ZelSim2MccMnc,'')=-3 failed."},
+        RefusedClear{"vconf_set_str", "db/private/zel/sim2/sim_msin", "vconf_set_str(ZelSim2Msin,'')=-3 failed."},
+        RefusedClear{"vconf_set_bool", "memory/private/zel/sim_changed", nullptr},
+        RefusedClear{"vconf_set_bool", "memory/private/zel/sim2/sim_changed", nullptr}));
