@@ -1,0 +1,158 @@
+#include "phone-state.h"
+
+#include <sqlite3.h>
+
+#include <algorithm>
+#include <filesystem>
+#include <fstream>
+#include <iterator>
+#include <memory>
+#include <regex>
+
+namespace zel_scenario {
+
+namespace {
+
+namespace fs = std::filesystem;
+
+constexpr const char *kOutput = "/opt/system/zel-default/output";
+constexpr const char *kData = "/opt/system/zel-default/data";
+
+// Folders whose files belong to the result of a run.
+constexpr const char *kListedFolders[] = {
+    "/opt/system/zel-default", "/opt/usr", "/csa", "/opt/dbspace",
+};
+
+std::string content(const fs::path &path) {
+    std::ifstream file{path, std::ios::binary};
+    return {std::istreambuf_iterator<char>{file}, {}};
+}
+
+std::string shown(const Json &value) { return value.is_string() ? value.get<std::string>() : value.dump(); }
+
+std::vector<std::string> keys(Phone &phone) {
+    std::vector<std::string> lines;
+    for (const Json &key : phone.call("vconf-list").at("keys"))
+        lines.push_back(key.at("type").get<std::string>() + " " + key.at("key").get<std::string>() + " = " +
+                        shown(key.at("value")));
+    std::sort(lines.begin(), lines.end());
+    return lines;
+}
+
+// The system log without what changes with every edit of the sources: "install.cpp: run(123) > " keeps its
+// file and function.
+std::vector<std::string> system_log(Phone &phone) {
+    static const std::regex line_number{R"(^([^ ]+: [^ ]+\()\d+(\) > ))"};
+    std::vector<std::string> lines;
+    for (const Json &entry : phone.call("log").at("messages")) {
+        std::string message = entry.at("message").get<std::string>();
+        message = std::regex_replace(message, line_number, "$1N$2");
+        std::replace(message.begin(), message.end(), '\n', '|');
+        lines.push_back(message);
+    }
+    return lines;
+}
+
+std::vector<std::string> file_lines(Phone &phone, const std::string &path) {
+    return lines_of(content(phone.outside(path)));
+}
+
+std::vector<std::string> media_status(Phone &phone, const std::string &path) {
+    static const std::regex size{R"((_size\s*=\s*)\d+)"};
+    return lines_of(std::regex_replace(content(phone.outside(path)), size, "$1N"));
+}
+
+std::string described(Phone &phone, const std::string &path) {
+    const Json stat = phone.call("stat", {{"path", path}});
+    std::string line = path;
+    for (const char *field : {"type", "mode", "owner", "group", "label"})
+        if (stat.contains(field) && !stat[field].is_null()) line += std::string{" "} + field + "=" + shown(stat[field]);
+    return line;
+}
+
+std::vector<std::string> files(Phone &phone) {
+    std::vector<std::string> lines;
+    for (const char *folder : kListedFolders) {
+        const std::string outside = phone.outside(folder);
+        if (!fs::exists(outside)) continue;
+        for (const auto &entry : fs::recursive_directory_iterator{outside})
+            lines.push_back(described(phone, entry.path().string().substr(phone.root().size())));
+    }
+    std::sort(lines.begin(), lines.end());
+    return lines;
+}
+
+struct CloseDatabase {
+    void operator()(sqlite3 *database) const { sqlite3_close(database); }
+};
+
+std::vector<std::string> rows(const std::string &path, const std::string &table) {
+    sqlite3 *raw = nullptr;
+    const int opened = sqlite3_open_v2(path.c_str(), &raw, SQLITE_OPEN_READONLY, nullptr);
+    const std::unique_ptr<sqlite3, CloseDatabase> database{raw};
+    std::vector<std::string> lines;
+    if (opened != SQLITE_OK) return lines;
+    const auto add_row = [](void *to, int columns, char **values, char **names) {
+        std::string line;
+        for (int i = 0; i < columns; ++i)
+            line += std::string{i ? " " : ""} + names[i] + "=" + (values[i] ? values[i] : "NULL");
+        static_cast<std::vector<std::string> *>(to)->push_back(line);
+        return 0;
+    };
+    sqlite3_exec(database.get(), ("select * from " + table).c_str(), add_row, &lines, nullptr);
+    return lines;
+}
+
+void add(PhoneState &state, const std::string &section, std::vector<std::string> lines) {
+    if (!lines.empty()) state[section] = std::move(lines);
+}
+
+void add_databases(Phone &phone, PhoneState &state) {
+    for (const auto &[name, path] : {std::pair{"sim1", "/opt/dbspace/.dnet.db"}, {"sim2", "/opt/dbspace/.dnet2.db"}})
+        for (const char *table : {"network_info", "pdp_profile", "fast_dormancy", "max_pdp"})
+            add(state, std::string{"networks-"} + name + "/" + table, rows(phone.outside(path), table));
+}
+
+void add_section_store(Phone &phone, PhoneState &state) {
+    const std::string folder = phone.outside(kData);
+    if (!fs::exists(folder)) return;
+    for (const auto &file : fs::directory_iterator{folder})
+        add(state, "data/" + file.path().filename().string(), lines_of(content(file.path())));
+}
+
+} // namespace
+
+std::vector<std::string> lines_of(const std::string &text) {
+    std::vector<std::string> lines;
+    std::size_t at = 0;
+    while (at < text.size()) {
+        const std::size_t end = std::min(text.find('\n', at), text.size());
+        lines.push_back(text.substr(at, end - at));
+        at = end + 1;
+    }
+    return lines;
+}
+
+std::string text_of(const std::vector<std::string> &lines) {
+    std::string text;
+    for (const std::string &line : lines)
+        text.append(line).append("\n");
+    return text;
+}
+
+PhoneState read_state(Phone &phone) {
+    const std::string output = kOutput;
+    PhoneState state;
+    add(state, "keys", keys(phone));
+    add(state, "system-log", system_log(phone));
+    add(state, "run-log", file_lines(phone, output + "/zel-config.log"));
+    add(state, "time-laps", file_lines(phone, output + "/zel-time-lap.log"));
+    add(state, "fs-status-config", media_status(phone, output + "/zel-fs-status-config.ini"));
+    add(state, "fs-status-verify", media_status(phone, output + "/zel-fs-status-verify.ini"));
+    add(state, "files", files(phone));
+    add_section_store(phone, state);
+    add_databases(phone, state);
+    return state;
+}
+
+} // namespace zel_scenario

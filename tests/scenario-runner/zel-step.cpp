@@ -1,0 +1,93 @@
+// Calls one exported entry point on the phone in $ZEL_ROOT, in a process of its own, and prints what it
+// answers: `zel-step config XFV`. Linked with the shared library alone, as the platform's boot code is.
+
+#include "zel-svc.h"
+
+#include <cstdio>
+#include <cstdlib>
+#include <cstring>
+#include <memory>
+#include <string_view>
+
+namespace {
+
+struct Step {
+    const char *name;
+    int arguments;
+    void (*run)(char **arguments);
+};
+
+void print_text(int result, const char *text) { std::printf("%d '%s'\n", result, text); }
+
+void internal_name(char **arguments) {
+    char name[10];
+    const int result = zel_svc_config_get_internal_customer_name(arguments[0], name, sizeof name);
+    print_text(result, name);
+}
+
+void active_customer(char ** /*none*/) {
+    char name[10] = "";
+    const int result = zel_svc_config_get_active_customer_name(name, sizeof name);
+    print_text(result, name);
+}
+
+void first_customer(char ** /*none*/) {
+    char name[10] = "";
+    const int result = zel_svc_config_get_first_customer_name_in_zel_bin(name, sizeof name);
+    print_text(result, name);
+}
+
+void version(char ** /*none*/) {
+    char text[20] = "";
+    const int result = zel_svc_config_get_zel_bin_version(text, sizeof text);
+    print_text(result, text);
+}
+
+void customers(char ** /*none*/) {
+    const auto list = std::make_unique<ZelSvcCustomer[]>(ZEL_SVC_MAX_CUSTOMERS);
+    int count = 0;
+    const int result = zel_svc_config_get_customer_list(list.get(), &count);
+    std::printf("%d, %d customers\n", result, count);
+    for (int i = 0; i < count; ++i)
+        std::printf("%s %s\n", list[static_cast<unsigned>(i)].name, list[static_cast<unsigned>(i)].path);
+}
+
+void approval(char ** /*none*/) {
+    ZelSvcApprovalVersion versions;
+    const int result = zel_svc_config_get_approval_version(&versions);
+    std::printf("%d ap='%s' cp='%s' zel='%s'\n", result, versions.ap, versions.cp, versions.zel);
+}
+
+void install(char **arguments) { zel_svc_config_install_customer(arguments[0], std::atoi(arguments[1])); }
+
+constexpr Step kSteps[] = {
+    {"config", 1, [](char **a) { zel_svc_config_set_pre_config_for_config_mode(a[0]); }},
+    {"fota", 1, [](char **a) { zel_svc_config_upgrade_pre_config_for_fota_mode(a[0]); }},
+    {"boot", 0, [](char **) { zel_svc_config_upgrade_pre_config_for_normal_booting(); }},
+    {"imei", 1, [](char **a) { std::printf("%d\n", zel_svc_config_set_pre_config_for_imei(a[0])); }},
+    {"factory-reset", 0, [](char **) { std::printf("%d\n", zel_svc_config_set_pre_config_for_factory_reset()); }},
+    {"reboot", 0, [](char **) { zel_svc_config_reboot(); }},
+    {"install", 2, install},
+    {"header", 0, [](char **) { zel_svc_config_install_header(); }},
+    {"internal-name", 1, internal_name},
+    {"active-customer", 0, active_customer},
+    {"first-customer", 0, first_customer},
+    {"customers", 0, customers},
+    {"version", 0, version},
+    {"approval", 0, approval},
+};
+
+} // namespace
+
+int main(int argc, char **argv) {
+    for (const Step &step : kSteps) {
+        if (argc < 2 || std::string_view{step.name} != argv[1]) continue;
+        if (argc - 2 != step.arguments) break;
+        step.run(argv + 2);
+        return 0;
+    }
+    std::fprintf(stderr, "usage: zel-step STEP [ARGUMENTS]\n");
+    for (const Step &step : kSteps)
+        std::fprintf(stderr, "  %s (%d arguments)\n", step.name, step.arguments);
+    return 2;
+}
