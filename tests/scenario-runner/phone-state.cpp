@@ -44,7 +44,7 @@ std::vector<std::string> keys(Phone &phone) {
 std::vector<std::string> system_log(Phone &phone) {
     static const std::regex line_number{R"(^([^ ]+: [^ ]+\()\d+(\) > ))"};
     std::vector<std::string> lines;
-    for (const Json &entry : phone.call("log").at("messages")) {
+    for (const Json &entry : phone.call("log").at("lines")) {
         std::string message = entry.at("message").get<std::string>();
         message = std::regex_replace(message, line_number, "$1N$2");
         std::replace(message.begin(), message.end(), '\n', '|');
@@ -65,7 +65,7 @@ std::vector<std::string> media_status(Phone &phone, const std::string &path) {
 std::string described(Phone &phone, const std::string &path) {
     const Json stat = phone.call("stat", {{"path", path}});
     std::string line = path;
-    for (const char *field : {"type", "mode", "owner", "group", "label"})
+    for (const char *field : {"kind", "mode", "owner", "group", "label"})
         if (stat.contains(field) && !stat[field].is_null()) line += std::string{" "} + field + "=" + shown(stat[field]);
     return line;
 }
