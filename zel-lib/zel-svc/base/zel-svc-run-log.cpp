@@ -8,20 +8,6 @@
 #include <fcntl.h>
 #include <string>
 
-namespace {
-
-std::string formatted(const char *format, std::va_list arguments) {
-    std::va_list again;
-    va_copy(again, arguments);
-    const int size = std::vsnprintf(nullptr, 0, format, arguments);
-    std::string line(size > 0 ? static_cast<std::size_t>(size) : 0, '\0');
-    if (!line.empty()) std::vsnprintf(line.data(), line.size() + 1, format, again);
-    va_end(again);
-    return line;
-}
-
-} // namespace
-
 int zel_svc_config_print_log_file(const char *text) {
     if (!text) return 0;
     zel_svc_observer().run_log_line(text);
@@ -36,7 +22,12 @@ int zel_svc_config_print_log_file(const char *text) {
 void zel_svc_run_log(const char *format, ...) {
     std::va_list arguments;
     va_start(arguments, format);
-    const std::string line = formatted(format, arguments);
+    const int size = std::vsnprintf(nullptr, 0, format, arguments);
+    va_end(arguments);
+    if (size <= 0) return;
+    std::string line(static_cast<std::size_t>(size), '\0');
+    va_start(arguments, format);
+    std::vsnprintf(line.data(), line.size() + 1, format, arguments);
     va_end(arguments);
     zel_svc_config_print_log_file(line.c_str());
 }
