@@ -44,7 +44,7 @@ auto answer(Body body, const Arguments &...arguments) -> std::invoke_result_t<Bo
         Phone *phone = process_phone();
         if (phone == nullptr) return failed(row.result, ENODEV);
         if (phone->page().journal_on.load(std::memory_order_relaxed) != 0) journal(*phone, row, {Value(arguments)...});
-        if (phone->page().fault_change.load(std::memory_order_relaxed) != 0) {
+        if (any_faults(*phone)) {
             const Fault *fault = matching_fault(*phone, row, text_argument(row.text, arguments...));
             if (fault != nullptr) return failed(fault->result, fault->error);
         }

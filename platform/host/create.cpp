@@ -1,13 +1,13 @@
 #include "create.h"
 
 #include "content.h"
+#include "folder.h"
 #include "layout.h"
 #include "open-file.h"
 #include "record.h"
 #include "verb.h"
 
 #include <cstring>
-#include <dirent.h>
 #include <fcntl.h>
 #include <sys/stat.h>
 
@@ -18,23 +18,13 @@ constexpr const char *kProductCode = "/csa/imei/prodcode.dat";
 
 [[noreturn]] void fail(const std::string &what) { throw VerbFailed(what + ": " + std::strerror(errno)); }
 
-bool is_empty(int folder) {
-    DIR *entries = ::fdopendir(::openat(folder, ".", O_RDONLY | O_DIRECTORY | O_CLOEXEC));
-    if (entries == nullptr) return false;
-    bool empty = true;
-    while (const dirent *entry = ::readdir(entries)) // NOLINT(concurrency-mt-unsafe): this stream is ours
-        empty = empty && (std::strcmp(entry->d_name, ".") == 0 || std::strcmp(entry->d_name, "..") == 0);
-    ::closedir(entries);
-    return empty;
-}
-
 Fd open_empty_folder(const std::string &path) {
     if (::mkdir(path.c_str(), 0755) != 0 && errno != EEXIST) fail("cannot make '" + path + "'");
     Fd folder(::open(path.c_str(), O_PATH | O_DIRECTORY | O_CLOEXEC));
     if (!folder) fail("cannot open '" + path + "'");
     if (is_forbidden_root(folder.get()))
         throw VerbFailed("'" + path + "' is never a phone: it is the root or home folder of this machine");
-    if (!is_empty(folder.get())) throw VerbFailed("'" + path + "' is not empty");
+    if (!names_in(folder.get()).empty()) throw VerbFailed("'" + path + "' is not empty");
     return folder;
 }
 

@@ -1,4 +1,5 @@
 #include "call.h"
+#include "database-faults.h"
 
 #include <db-util.h>
 #include <sys/stat.h>
@@ -18,6 +19,7 @@ int open_database(Phone &phone, const char *path, sqlite3 **database) {
     if (result == SQLITE_OK) {
         // Otherwise large statements would make files in the workstation's temporary folder.
         sqlite3_exec(*database, "PRAGMA temp_store=MEMORY", nullptr, nullptr, nullptr);
+        watch_database(phone, *database, path);
         return SQLITE_OK;
     }
     sqlite3_close(*database);

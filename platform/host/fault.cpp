@@ -1,5 +1,6 @@
 #include "fault.h"
 
+#include <string_view>
 #include <vector>
 
 namespace zel_host {
@@ -16,8 +17,10 @@ void read_again(Phone &phone, KnownFaults &known, std::uint64_t change) {
     known.change = change;
 }
 
-bool matches(const Fault &fault, const Function &row, const std::string_view text) {
-    return fault.function == row.name && (fault.text.empty() || fault.text == text);
+bool matches(const Fault &fault, const Function &row, std::string_view text) {
+    if (fault.function != row.name) return false;
+    if (fault.text.empty() || fault.text == text) return true;
+    return row.part && text.find(fault.text) != std::string_view::npos;
 }
 
 // Counts a matching call, and says whether it is one of those that fail.
@@ -66,6 +69,8 @@ void each_fault(Phone &phone, const std::function<void(const Fault &fault, std::
              .error = static_cast<int>(query.integer(6))},
             query.integer(7));
 }
+
+bool any_faults(Phone &phone) { return phone.page().fault_change.load(std::memory_order_relaxed) != 0; }
 
 void clear_faults(Phone &phone) {
     phone.store().query("DELETE FROM fault").run();

@@ -24,6 +24,9 @@ struct Fault {
 // have changed.
 const Fault *matching_fault(Phone &phone, const Function &row, const char *text);
 
+// False as long as none was ever set: the cheap question before the one above.
+bool any_faults(Phone &phone);
+
 // Adds a fault, its id aside, and returns its id.
 std::int64_t add_fault(Phone &phone, const Fault &fault);
 void each_fault(Phone &phone, const std::function<void(const Fault &fault, std::int64_t seen)> &use);

@@ -3,6 +3,7 @@
 #include "open-file.h"
 
 #include <cstring>
+#include <fcntl.h>
 #include <zel-platform.h>
 
 namespace zel_host {
@@ -10,7 +11,13 @@ namespace {
 
 int open_path(Phone &phone, const char *path, int flags, mode_t mode) {
     errno = EFAULT;
-    return path == nullptr ? -1 : open_file(phone, path, flags, mode);
+    if (path == nullptr) return -1;
+    const bool writes = (flags & O_ACCMODE) != O_RDONLY;
+    if (writes && any_faults(phone) && matching_fault(phone, kFunctions[function("disk_full")], path) != nullptr) {
+        errno = ENOSPC;
+        return -1;
+    }
+    return open_file(phone, path, flags, mode);
 }
 
 int open_parent(Phone &phone, const char *path, char *name) {

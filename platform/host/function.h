@@ -17,8 +17,9 @@ enum class Failing {
 struct Function {
     std::string_view name;
     Failing failing = Failing::Result;
-    int result = -1; // what it returns when it fails, unless a fault says otherwise
-    int text = -1;   // number of the argument that is its text, from 0; -1: it has none
+    int result = -1;   // what it returns when it fails, unless a fault says otherwise
+    int text = -1;     // number of the argument that is its text, from 0; -1: it has none
+    bool part = false; // a fault's text matches when it is a part of the call's
 };
 
 inline constexpr Function kFunctions[] = {
@@ -46,6 +47,12 @@ inline constexpr Function kFunctions[] = {
     {.name = "zel_platform_sync", .failing = Failing::Nothing},
     {.name = "zel_platform_reboot"},
     {.name = "zel_platform_now"},
+    // What is no function of the platform, but fails on phones: statements on databases that db_util_open()
+    // opened (database-faults.h), and storage that is full (no file opens for writing, databases do not grow).
+    {.name = "sqlite3_prepare_v2", .result = 18, .text = 0},        // SQLITE_TOOBIG
+    {.name = "sqlite3_bind_text", .result = 18, .text = 0},         // SQLITE_TOOBIG
+    {.name = "sqlite3_step", .result = 9, .text = 0, .part = true}, // SQLITE_INTERRUPT
+    {.name = "disk_full", .text = 0},
 };
 
 // The number of a function's row; a name without a row does not compile.

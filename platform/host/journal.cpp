@@ -32,4 +32,12 @@ void journal(Phone &phone, const Function &row, std::initializer_list<Value> arg
     query.bind(row.name).bind(text).run();
 }
 
+void each_call(Phone &phone, const std::function<void(std::string_view function, std::string_view arguments)> &use) {
+    Query query = phone.store().query("SELECT function, arguments FROM journal ORDER BY id");
+    while (query.row())
+        use(query.view(0), query.view(1));
+}
+
+void clear_journal(Phone &phone) { phone.store().query("DELETE FROM journal").run(); }
+
 } // namespace zel_host

@@ -5,6 +5,7 @@
 #include "phone.h"
 
 #include <cstdint>
+#include <functional>
 #include <initializer_list>
 #include <string_view>
 #include <type_traits>
@@ -30,5 +31,9 @@ struct Value {
 };
 
 void journal(Phone &phone, const Function &row, std::initializer_list<Value> arguments);
+
+// The calls in order; `arguments` is a JSON list, texts that are no UTF-8 with U+FFFD.
+void each_call(Phone &phone, const std::function<void(std::string_view function, std::string_view arguments)> &use);
+void clear_journal(Phone &phone);
 
 } // namespace zel_host

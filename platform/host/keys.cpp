@@ -34,6 +34,10 @@ bool unset_key(Phone &phone, std::string_view key) {
     return existed;
 }
 
+void unset_keys(Phone &phone, std::string_view prefix) {
+    phone.store().query("DELETE FROM vconf WHERE substr(key, 1, length(?1)) = ?1").bind(prefix).run();
+}
+
 void each_key(Phone &phone, std::string_view prefix,
               const std::function<void(std::string_view key, const KeyValue &value)> &use) {
     Query query =

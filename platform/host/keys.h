@@ -25,6 +25,7 @@ std::optional<KeyValue> get_key(Phone &phone, std::string_view key);
 void set_key(Phone &phone, std::string_view key, KeyType type, std::int64_t number);
 void set_key(Phone &phone, std::string_view key, std::string_view text);
 bool unset_key(Phone &phone, std::string_view key);
+void unset_keys(Phone &phone, std::string_view prefix);
 // All keys that begin with `prefix`, in order.
 void each_key(Phone &phone, std::string_view prefix,
               const std::function<void(std::string_view key, const KeyValue &value)> &use);

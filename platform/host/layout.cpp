@@ -20,7 +20,8 @@ CREATE TABLE fault (id INTEGER PRIMARY KEY AUTOINCREMENT, function TEXT NOT NULL
                     first INTEGER NOT NULL, times INTEGER NOT NULL, result INTEGER NOT NULL,
                     error INTEGER NOT NULL, seen INTEGER NOT NULL DEFAULT 0);
 CREATE TABLE journal (id INTEGER PRIMARY KEY, function TEXT NOT NULL, arguments TEXT NOT NULL);
-CREATE TABLE tool (path TEXT PRIMARY KEY, status INTEGER NOT NULL) WITHOUT ROWID;
+CREATE TABLE tool (path TEXT PRIMARY KEY, status INTEGER NOT NULL, file TEXT NOT NULL,
+                   content TEXT NOT NULL) WITHOUT ROWID;
 )";
 
 // The telephony side reads pdp_profile by position: columns 24 and 25 follow one that only it writes.
@@ -66,7 +67,16 @@ constexpr const char *kFolders[] = {
 };
 
 constexpr const char *kNetworkDatabases[] = {"/opt/dbspace/.dnet.db", "/opt/dbspace/.dnet2.db"};
-constexpr const char *kTools[] = {"/usr/bin/pkgcmd", "/usr/bin/pkg", "/usr/bin/rpm-backend"};
+
+struct PlatformTool {
+    const char *path;
+    const char *file;
+};
+constexpr PlatformTool kTools[] = {
+    {"/usr/bin/pkgcmd", "-p"}, // writes the result list that its option -p names
+    {"/usr/bin/pkg", ""},
+    {"/usr/bin/rpm-backend", ""},
+};
 
 void make_folder(Phone &phone, std::string_view path) {
     for (std::size_t end = path.find('/', 1);; end = path.find('/', end + 1)) {
@@ -99,8 +109,8 @@ void make_platform(Phone &phone) {
         make_folder(phone, path);
     for (const char *path : kNetworkDatabases)
         make_network_database(phone, path);
-    for (const char *path : kTools)
-        add_tool(phone, path, 0);
+    for (const PlatformTool &tool : kTools)
+        add_tool(phone, {.path = tool.path, .exit_status = 0, .file = tool.file, .content = {}});
 }
 
 void announce_slots(Phone &phone) {

@@ -1,5 +1,7 @@
 #include "open-file.h"
 
+#include "listing.h"
+
 #include <cerrno>
 #include <fcntl.h>
 #include <sys/stat.h>
@@ -33,6 +35,8 @@ int open_file(Phone &phone, std::string_view path, int flags, mode_t mode) {
     // Told before the real open: opening a FIFO or a device can block, or act.
     if (!S_ISREG(status.st_mode) && !S_ISDIR(status.st_mode)) return refuse(EINVAL);
     if (makes(flags) && S_ISDIR(status.st_mode)) return refuse(EISDIR);
+    if (S_ISDIR(status.st_mode) && (flags & O_PATH) == 0 && is_root(phone, place.file.get()))
+        return open_listing(phone, flags);
     const std::string name = "/proc/self/fd/" + std::to_string(place.file.get());
     return ::open(name.c_str(), (flags & ~(O_CREAT | O_EXCL | O_NOFOLLOW)) | O_NONBLOCK | O_CLOEXEC);
 }

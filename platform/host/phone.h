@@ -24,12 +24,15 @@ class Phone {
     [[nodiscard]] int state_folder() const { return root_.state.get(); }
     [[nodiscard]] Store &store() { return store_; }
     [[nodiscard]] Page &page() { return *page_; }
+    // The lock on the phone, held until it is closed (phone-lock.h).
+    [[nodiscard]] Fd &lock() { return lock_; }
 
   private:
     Phone(Root root, Page *page);
     Root root_;
     Page *page_;
     Store store_;
+    Fd lock_;
 };
 
 // The phone that this process's platform calls act on: the one that $ZEL_ROOT names at the first call, for

@@ -40,8 +40,12 @@ class WrongArguments : public std::runtime_error {
 
 // All rows; each file of verbs has its own.
 std::span<const Verb> phone_verbs();
+std::span<const Verb> file_verbs();
 std::span<const Verb> key_verbs();
+std::span<const Verb> clock_verbs();
+std::span<const Verb> log_verbs();
 std::span<const Verb> fault_verbs();
+std::span<const Verb> tool_verbs();
 std::span<const std::span<const Verb>> all_verbs();
 
 const Verb *find_verb(std::string_view name);

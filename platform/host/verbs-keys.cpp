@@ -56,8 +56,8 @@ Json set(Phone &phone, const Json &arguments) {
     const std::string key = text_of(arguments, "key");
     const std::string type = text_of(arguments, "type", "string");
     std::string value = text_of(arguments, "value");
-    if (arguments.contains("value_hex") && !from_hex(text_of(arguments, "value_hex"), value))
-        throw WrongArguments("'value_hex' is no text of hexadecimal digit pairs");
+    if (arguments.contains("value-hex") && !from_hex(text_of(arguments, "value-hex"), value))
+        throw WrongArguments("'value-hex' is no text of hexadecimal digit pairs");
     if (key.empty()) throw WrongArguments("a key is not empty");
     if (value.find('\0') != std::string::npos) throw WrongArguments("a value holds no zero byte");
     if (type == "int")
@@ -90,7 +90,7 @@ constexpr Argument kSetArguments[] = {
     {.name = "key", .required = true, .help = "The key"},
     {.name = "type", .help = "int, bool or string (the default)"},
     {.name = "value", .help = "The value; for bool true, false, 1 or 0"},
-    {.name = "value_hex", .help = "The bytes of the value instead, two digits each"},
+    {.name = "value-hex", .help = "The bytes of the value instead, two digits each"},
 };
 constexpr Argument kListArguments[] = {{.name = "prefix", .help = "Only keys that begin so"}};
 

@@ -1,19 +1,22 @@
-#include "attributes.h"
-#include "clock.h"
 #include "create.h"
+#include "fault.h"
+#include "keys.h"
+#include "layout.h"
+#include "package.h"
+#include "phone-lock.h"
 #include "record.h"
-#include "system-log.h"
 #include "text.h"
 #include "verb.h"
-
-#include <array>
-#include <cstring>
-#include <sys/stat.h>
 
 namespace zel_host {
 namespace {
 
 constexpr std::int64_t kMostSlots = 2;
+constexpr const char *kForgotten[] = {"display_lock_1", "toolkit_users", "restart_command"};
+
+Json shown(const Copied &copied) {
+    return {{"files", copied.files}, {"folders", copied.folders}, {"links", copied.links}, {"skipped", copied.skipped}};
+}
 
 Json create(const Json &arguments) {
     const std::int64_t slots = number_of(arguments, "sims", 1);
@@ -21,90 +24,88 @@ Json create(const Json &arguments) {
     NewPhone wanted{.root = text_of(arguments, "root"), .slots = static_cast<int>(slots), .product_code = {}};
     if (arguments.contains("product-code")) wanted.product_code = text_of(arguments, "product-code");
     const std::unique_ptr<Phone> phone = create_phone(wanted);
-    return {{"root", printable(phone->path())}};
+    Json result{{"slots", slots}};
+    put_text(result, "root", phone->path());
+    if (arguments.contains("package"))
+        result["package"] = shown(replace_package(*phone, text_of(arguments, "package")));
+    return result;
 }
 
-const char *word_for(ClockMode mode) {
-    switch (mode) {
-    case ClockMode::Runs:
-        return "runs";
-    case ClockMode::Shifted:
-        return "set";
-    case ClockMode::Stands:
-        return "stands";
-    }
-    return "";
+Json package(Phone &phone, const Json &arguments) {
+    return shown(replace_package(phone, text_of(arguments, "folder")));
 }
 
 Json status(Phone &phone, const Json & /*arguments*/) {
-    Json result{{"slots", recorded_number(phone, "slots", 1)},
+    const std::int64_t slots = recorded_number(phone, "slots", 1);
+    Json result{{"slots", slots},
                 {"sim_states", Json::array()},
-                {"clock", {{"mode", word_for(phone.page().clock_mode.load())}, {"us", now_us(phone)}}},
                 {"display_locked", recorded_number(phone, "display_lock_1") != 0},
                 {"toolkit_users", recorded_number(phone, "toolkit_users")},
-                {"restarts", recorded_number(phone, "restarts")},
+                {"boots", recorded_number(phone, "boots")},
+                {"restarts_asked", recorded_number(phone, "restarts")},
                 {"restart_command", recorded_number(phone, "restart_command")},
-                {"theme_kind", recorded_number(phone, "theme_kind")}};
+                {"theme_kind", recorded_number(phone, "theme_kind")},
+                {"faults", any_faults(phone)},
+                {"journal", phone.page().journal_on.load() != 0}};
     put_text(result, "root", phone.path());
     put_text(result, "theme_picture", recorded_text(phone, "theme_picture"));
-    for (std::int64_t slot = 1; slot <= recorded_number(phone, "slots", 1); ++slot)
+    for (std::int64_t slot = 1; slot <= slots; ++slot)
         result["sim_states"].push_back(recorded_number(phone, "sim_state_" + std::to_string(slot)));
     return result;
 }
 
-const char *kind_of(mode_t mode) {
-    if (S_ISREG(mode)) return "file";
-    if (S_ISDIR(mode)) return "folder";
-    if (S_ISLNK(mode)) return "link";
-    return "special";
+Json restart(Phone &phone, const Json & /*arguments*/) {
+    Transaction transaction(phone.store());
+    unset_keys(phone, kMemoryKeys);
+    for (const char *name : kForgotten)
+        record(phone, name, 0);
+    announce_slots(phone);
+    const std::int64_t boots = recorded_number(phone, "boots") + 1;
+    record(phone, "boots", boots);
+    transaction.commit();
+    return {{"boots", boots}};
 }
 
-Json stat_path(Phone &phone, const Json &arguments) {
-    const std::string path = text_of(arguments, "path");
-    const Place place = resolve(phone.folder(), path, Follow::NotLast);
-    struct stat status {};
-    if (!place.file || ::fstat(place.file.get(), &status) != 0)
-        throw VerbFailed("'" + path + "': " + std::strerror(place.error));
-    std::array<char, 5> mode{};
-    std::snprintf(mode.data(), mode.size(), "%04o", status.st_mode & 07777U);
-    const std::optional<Owner> owner = get_owner(phone, place.file.get());
-    const std::optional<std::string> label = get_label(phone, place.file.get());
-    Json result{{"kind", kind_of(status.st_mode)},
-                {"mode", mode.data()},
-                {"size", status.st_size},
-                {"mtime", status.st_mtime},
-                {"owner", owner ? Json(owner->user) : Json()},
-                {"group", owner ? Json(owner->group) : Json()},
-                {"label", nullptr}};
-    put_text(result, "path", path);
-    if (label) put_text(result, "label", *label);
-    return result;
+Json reset(Phone &phone, const Json & /*arguments*/) {
+    reset_phone(phone);
+    return Json::object();
 }
 
-Json show_log(Phone &phone, const Json & /*arguments*/) {
-    Json lines = Json::array();
-    each_log_line(phone, [&lines](std::string_view line) {
-        Json parsed = Json::parse(line, nullptr, false);
-        if (!parsed.is_discarded()) lines.push_back(std::move(parsed));
-    });
-    return {{"lines", lines}};
+Json lock(Phone &phone, const Json &arguments) {
+    take_lock(phone, text_of(arguments, "holder"));
+    return Json::object();
+}
+
+Json sim(Phone &phone, const Json &arguments) {
+    const std::int64_t slot = number_of(arguments, "slot");
+    if (slot < 1 || slot > kMostSlots) throw WrongArguments("a slot is 1 or 2");
+    if (arguments.contains("state")) record(phone, "sim_state_" + std::to_string(slot), number_of(arguments, "state"));
+    announce_slots(phone);
+    return {{"slot", slot}, {"state", recorded_number(phone, "sim_state_" + std::to_string(slot))}};
 }
 
 constexpr Argument kCreateArguments[] = {
     {.name = "root", .required = true, .help = "The folder, empty or not there yet"},
+    {.name = "package", .help = "Folder of a customisation package to put on the phone"},
     {.name = "sims", .type = ArgumentType::Integer, .help = "Number of SIM slots: 0, 1 (the default) or 2"},
     {.name = "product-code", .help = "Text of the product code file; none without it"},
 };
-constexpr Argument kPathArguments[] = {{.name = "path", .required = true, .help = "Path on the phone"}};
+constexpr Argument kPackageArguments[] = {{.name = "folder", .required = true, .help = "Folder of the package"}};
+constexpr Argument kLockArguments[] = {
+    {.name = "holder", .required = true, .help = "Who takes the lock, as others are told"}};
+constexpr Argument kSimArguments[] = {
+    {.name = "slot", .type = ArgumentType::Integer, .required = true, .help = "The slot: 1 or 2"},
+    {.name = "state", .type = ArgumentType::Integer, .help = "Its new state: 0 absent, 1 inserted"},
+};
 
 constexpr Verb kVerbs[] = {
     {.name = "create", .help = "Make a phone", .arguments = kCreateArguments, .run_without_phone = create},
-    {.name = "status", .help = "Show slots, clock, display lock, theme and restarts", .run = status},
-    {.name = "stat",
-     .help = "Show one file's kind, mode, owner and label",
-     .arguments = kPathArguments,
-     .run = stat_path},
-    {.name = "log", .help = "Show the system log", .run = show_log},
+    {.name = "package", .help = "Replace the phone's package", .arguments = kPackageArguments, .run = package},
+    {.name = "status", .help = "Show slots, display lock, theme and restarts", .run = status},
+    {.name = "reboot", .help = "Restart: \"memory/\" keys vanish, the slots are announced", .run = restart},
+    {.name = "reset", .help = "Make the phone as new; package, product code, slots stay", .run = reset},
+    {.name = "lock", .help = "Hold the phone for this program alone", .arguments = kLockArguments, .run = lock},
+    {.name = "sim", .help = "Show or change the state of a SIM slot", .arguments = kSimArguments, .run = sim},
 };
 
 } // namespace

@@ -12,6 +12,12 @@
 // Any number of phones can be open at a time, whether or not this process also runs the library on one.
 // Every verb of `zel phone VERB` is a verb here with the same arguments and the same answer. Names and
 // values are raw: nothing is masked. No call is failed by an injected fault.
+//
+// Answers are valid JSON whatever bytes the phone holds: in a text that is no UTF-8 each byte that does not
+// belong shows as U+FFFD, and a second member, NAME_hex beside NAME, then holds the exact bytes as pairs of
+// hexadecimal digits. A value of any bytes is set with "value-hex".
+//
+// The verb "verbs" answers all verbs with their arguments, types and help.
 
 #ifdef __cplusplus
 extern "C" {
