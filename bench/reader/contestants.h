@@ -1,6 +1,6 @@
 #pragma once
 // Those that read the same file. Each visits every element and every text and counts them, so that nobody
-// gets away with reading less.
+// gets away with reading less. (Some report white space between tags and parts of a text on their own.)
 
 #include <cstddef>
 #include <span>

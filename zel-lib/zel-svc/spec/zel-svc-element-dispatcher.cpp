@@ -2,7 +2,7 @@
 
 #include "base/zel-svc-observer.h"
 #include "spec/zel-svc-element-index.h"
-#include "spec/zel-svc-element-stack.h"
+#include "spec/zel-svc-element-state.h"
 #include "spec/zel-svc-element-table.h"
 
 #include <exception>
@@ -17,24 +17,24 @@ std::int32_t gSourceOffset = 0;
 
 std::int32_t offset() { return gpSource ? gSourceOffset + gpSource->item : -1; }
 
+ZelSvcElementState &state() { return gZelSvcElementState; }
+
 const ZelSvcElement &row_of(ZelSvcElementId id) { return kZelSvcElementTable[static_cast<std::size_t>(id)]; }
 
-ZelSvcElementId find(std::string_view tag) {
-    return gIndex.find(tag, zel_svc_element_get_current_id(), zel_svc_element_get_enclosing_id());
-}
+ZelSvcElementId find(std::string_view tag) { return gIndex.find(tag, state().current(), state().enclosing()); }
 
-bool may_fire(ZelSvcElementId id) { return zel_svc_element_is_enabled(id) != 0 && row_of(id).enabled != 0; }
+bool may_fire(ZelSvcElementId id) { return !state().disabled[static_cast<std::size_t>(id)] && row_of(id).enabled != 0; }
 
 // The handler learns which element is on top, which is not the row's own where tags do not nest.
 void call(Handler handler, OccurrenceKind kind, std::string_view text, const ZelSvcXmlAttribute *attributes) {
-    const ZelSvcElementId current = zel_svc_element_get_current_id();
+    const ZelSvcElementId current = state().current();
     Occurrence occurrence{
         .kind = kind,
         .element = current,
         .tag = current != ZEL_SVC_ELEMENT_NONE ? row_of(current).tag : std::string_view{},
         .action = geZelSvcParseAction,
         .mode = geZelSvcParseMode,
-        .index = zel_svc_element_get_count(current),
+        .index = state().counts[static_cast<std::size_t>(current)],
         .offset = offset(),
         .text = text,
         .attributes = attributes,
@@ -83,13 +83,13 @@ std::int32_t zel_svc_element_on_start(std::uint32_t /*user*/, const char *name, 
     if (id == ZEL_SVC_ELEMENT_NONE) return unknown(tag);
     if (!may_fire(id)) return disabled(tag);
     // Too deep a nesting stores nothing, and the handler is called all the same.
-    zel_svc_element_push(id);
+    state().push(id);
     if (row_of(id).start) call(row_of(id).start, OccurrenceKind::Start, {}, attributes);
     return ZEL_SVC_DISPATCH_OK;
 }
 
 std::int32_t zel_svc_element_on_value(std::uint32_t /*user*/, const char *text, std::int32_t size) {
-    const ZelSvcElementId id = zel_svc_element_get_current_id();
+    const ZelSvcElementId id = state().current();
     if (id == ZEL_SVC_ELEMENT_NONE) return ZEL_SVC_DISPATCH_NO_ELEMENT;
     if (!may_fire(id)) return ZEL_SVC_DISPATCH_DISABLED;
     if (row_of(id).value) call(row_of(id).value, OccurrenceKind::Value, text_of(text, size), nullptr);
@@ -101,10 +101,10 @@ std::int32_t zel_svc_element_on_end(std::uint32_t /*user*/, const char *name) {
     if (id == ZEL_SVC_ELEMENT_NONE) return ZEL_SVC_DISPATCH_UNKNOWN;
     if (!may_fire(id)) return ZEL_SVC_DISPATCH_DISABLED;
     if (row_of(id).end) call(row_of(id).end, OccurrenceKind::End, {}, nullptr);
-    if (row_of(id).repeats) zel_svc_element_count_up(id);
+    if (row_of(id).repeats) ++state().counts[static_cast<std::size_t>(id)];
     // An end tag that does not close the top element leaves it open.
-    if (zel_svc_element_get_current_id() == id) zel_svc_element_pop();
-    return zel_svc_element_is_stop(id) != 0 ? ZEL_SVC_DISPATCH_STOP : ZEL_SVC_DISPATCH_OK;
+    if (state().current() == id) state().pop();
+    return state().is_stop(id) ? ZEL_SVC_DISPATCH_STOP : ZEL_SVC_DISPATCH_OK;
 }
 
 const ZelSvcXmlCallbacks kZelSvcElementCallbacks{

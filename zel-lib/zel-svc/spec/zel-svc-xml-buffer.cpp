@@ -46,7 +46,7 @@ ZelSvcXmlAttributes::~ZelSvcXmlAttributes() {
     std::free(spare_);
 }
 
-void ZelSvcXmlAttributes::clear() {
+void ZelSvcXmlAttributes::drop_blocks() {
     while (blocks_) {
         Block *block = blocks_;
         blocks_ = block->next;

@@ -37,7 +37,9 @@ class ZelSvcXmlAttributes {
     ZelSvcXmlAttributes &operator=(const ZelSvcXmlAttributes &) = delete;
     ~ZelSvcXmlAttributes();
 
-    void clear();
+    void clear() {
+        if (blocks_) drop_blocks();
+    }
     // Appends an attribute, its value entity-decoded. False when there is no memory.
     bool append(std::string_view name, std::string_view value);
     [[nodiscard]] const ZelSvcXmlAttribute *first() const { return first_; }
@@ -48,6 +50,7 @@ class ZelSvcXmlAttributes {
         std::size_t size; // of the bytes that follow
     };
 
+    void drop_blocks();
     char *allocate(std::size_t size);
     bool add_block(std::size_t size);
 

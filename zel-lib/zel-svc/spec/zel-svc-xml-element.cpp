@@ -5,6 +5,30 @@ namespace {
 
 enum class Tag { Open, Empty };
 
+// A name that ends within the next 32 bytes, found and copied at once; false leaves it to the plain reader.
+bool read_short_name(ZelSvcXmlInput &input, std::uint8_t ends, ZelSvcXmlName &name) {
+    static_assert(sizeof name.text == ZEL_SVC_XML_BLOCK_SIZE);
+    if (input.left() < ZEL_SVC_XML_BLOCK_SIZE) return false;
+    const ZelSvcXmlBlock block{input.at};
+    // Control bytes that are no delimiters stop here too, and are sorted out below.
+    ZelSvcXmlFits fits = block.at_most(' ') | block.equal('>');
+    if (ends == ZEL_SVC_XML_ENDS_ELEMENT) fits = fits | block.equal('/');
+    const std::uint32_t stops = zel_svc_xml_mask(fits);
+    if (stops == 0) return false;
+    const int length = std::countr_zero(stops);
+    const char *stop = input.at + length;
+    if ((kZelSvcXmlByteClasses[static_cast<unsigned char>(*stop)] & ends) == 0) return false;
+    block.store(name.text);
+    name.text[length] = '\0';
+    name.size = length + 1;
+    input.at = stop;
+    return length != 0;
+}
+
+ZelSvcXmlResult read_name(ZelSvcXmlInput &input, std::uint8_t ends, ZelSvcXmlName &name) {
+    return read_short_name(input, ends, name) ? ZEL_SVC_XML_OK : zel_svc_xml_read_name(input, ends, name);
+}
+
 ZelSvcXmlResult read_attribute(ZelSvcXmlRun &run) {
     ZelSvcXmlInput &input = run.input;
     std::string_view name;
@@ -36,7 +60,7 @@ ZelSvcXmlResult read_start_tag(ZelSvcXmlRun &run, Tag &tag) {
     const ZelSvcXmlCallbacks &callbacks = *run.parser.callbacks;
     const char *item = run.input.at++;
     ZelSvcXmlName name;
-    if (const auto result = zel_svc_xml_read_name(run.input, ZEL_SVC_XML_ENDS_ELEMENT, name)) return result;
+    if (const auto result = read_name(run.input, ZEL_SVC_XML_ENDS_ELEMENT, name)) return result;
     if (const auto result = read_rest_of_tag(run, tag)) return result;
     run.locate(item);
     if (callbacks.start_element) callbacks.start_element(run.parser.user, name.text, name.size, run.attributes.first());
@@ -51,7 +75,7 @@ ZelSvcXmlResult read_end_tag(ZelSvcXmlRun &run) {
     const char *item = input.at;
     ZelSvcXmlName name;
     if (const auto result = input.match("</")) return result;
-    if (const auto result = zel_svc_xml_read_name(input, ZEL_SVC_XML_ENDS_END_TAG, name)) return result;
+    if (const auto result = read_name(input, ZEL_SVC_XML_ENDS_END_TAG, name)) return result;
     if (const auto result = input.skip_space()) return result;
     if (*input.at != '>') ++input.at;
     if (const auto result = input.match('>')) return result;
@@ -62,16 +86,37 @@ ZelSvcXmlResult read_end_tag(ZelSvcXmlRun &run) {
     return ZEL_SVC_XML_STOP;
 }
 
+// A text that ends within the next 32 bytes and stands as it is: its length, 0 for any other.
+std::size_t short_text(const ZelSvcXmlInput &input, char *copy) {
+    if (input.left() < ZEL_SVC_XML_BLOCK_SIZE) return 0;
+    const ZelSvcXmlBlock block{input.at};
+    const std::uint32_t stops = zel_svc_xml_mask(block.equal('<') | block.equal('&') | block.equal('\0'));
+    if (stops == 0) return 0;
+    const auto length = static_cast<std::size_t>(std::countr_zero(stops));
+    if (input.at[length] != '<') return 0;
+    block.store(copy);
+    return length;
+}
+
 ZelSvcXmlResult read_text(ZelSvcXmlRun &run) {
     const char *item = run.input.at;
-    const void *next = std::memchr(item, '<', run.input.left());
-    if (!next) return run.input.to_end();
-    run.input.at = static_cast<const char *>(next);
-    const std::string_view raw = zel_svc_xml_to_nul({item, static_cast<std::size_t>(run.input.at - item)});
-    if (raw.empty() || !run.parser.callbacks->text) return ZEL_SVC_XML_OK;
-    char *copy = run.text.copy(raw);
+    char *copy = run.text.reserve(ZEL_SVC_XML_BLOCK_SIZE);
     if (!copy) return ZEL_SVC_XML_ERR_SYNTAX;
-    const std::size_t length = zel_svc_xml_decode_in_place(copy, raw.size());
+    std::size_t length = short_text(run.input, copy);
+    if (length != 0) {
+        copy[length] = '\0';
+        run.input.at += length;
+    } else {
+        const void *next = std::memchr(item, '<', run.input.left());
+        if (!next) return run.input.to_end();
+        run.input.at = static_cast<const char *>(next);
+        const std::string_view raw = zel_svc_xml_to_nul({item, static_cast<std::size_t>(run.input.at - item)});
+        if (raw.empty()) return ZEL_SVC_XML_OK;
+        copy = run.text.copy(raw);
+        if (!copy) return ZEL_SVC_XML_ERR_SYNTAX;
+        length = zel_svc_xml_decode_in_place(copy, raw.size());
+    }
+    if (!run.parser.callbacks->text) return ZEL_SVC_XML_OK;
     run.locate(item);
     run.parser.callbacks->text(run.parser.user, copy, static_cast<std::int32_t>(length + 1));
     return ZEL_SVC_XML_OK;

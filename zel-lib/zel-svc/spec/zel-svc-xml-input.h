@@ -2,9 +2,11 @@
 // The bytes that the tokenizer reads, and its primitive readers. Each returns the result of the reading and
 // leaves the position where reading stopped.
 
+#include "spec/zel-svc-xml-block.h"
 #include "spec/zel-svc-xml.h"
 
 #include <array>
+#include <bit>
 #include <cstddef>
 #include <cstdint>
 #include <cstring>
@@ -23,8 +25,9 @@ enum ZelSvcXmlByteClass : std::uint8_t {
 constexpr std::array<std::uint8_t, 256> zel_svc_xml_byte_classes() {
     std::array<std::uint8_t, 256> classes = {};
     for (const char space : {' ', '\t', '\n', '\r'})
-        classes[static_cast<unsigned char>(space)] = ZEL_SVC_XML_SPACE | ZEL_SVC_XML_ENDS_ELEMENT | ZEL_SVC_XML_ENDS_END_TAG |
-                         ZEL_SVC_XML_ENDS_ATTRIBUTE | ZEL_SVC_XML_ENDS_TARGET;
+        classes[static_cast<unsigned char>(space)] = ZEL_SVC_XML_SPACE | ZEL_SVC_XML_ENDS_ELEMENT |
+                                                     ZEL_SVC_XML_ENDS_END_TAG | ZEL_SVC_XML_ENDS_ATTRIBUTE |
+                                                     ZEL_SVC_XML_ENDS_TARGET;
     classes['\0'] = ZEL_SVC_XML_NUL;
     classes['>'] = ZEL_SVC_XML_ENDS_ELEMENT | ZEL_SVC_XML_ENDS_END_TAG;
     classes['/'] = ZEL_SVC_XML_ENDS_ELEMENT;
@@ -46,6 +49,13 @@ struct ZelSvcXmlInput {
 
     // To the first byte that is no white space; EOF when there is none.
     ZelSvcXmlResult skip_space() {
+        while (left() >= ZEL_SVC_XML_BLOCK_SIZE) {
+            const ZelSvcXmlBlock block{at};
+            const std::uint32_t others =
+                ~zel_svc_xml_mask(block.equal(' ') | block.equal('\n') | block.equal('\t') | block.equal('\r'));
+            at += std::countr_zero(others);
+            if (others != 0) return ZEL_SVC_XML_OK;
+        }
         while (at < end && is(ZEL_SVC_XML_SPACE))
             ++at;
         return at < end ? ZEL_SVC_XML_OK : ZEL_SVC_XML_ERR_EOF;
