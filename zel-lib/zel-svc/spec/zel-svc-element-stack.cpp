@@ -9,6 +9,9 @@ namespace {
 ZelSvcElementState &state() { return gZelSvcElementState; }
 bool is_row(ZelSvcElementId id) { return id >= 0 && id < ZEL_SVC_ELEMENT_COUNT; }
 
+// The list may name no element, too.
+bool may_be_listed(ZelSvcElementId id) { return is_row(id) || id == ZEL_SVC_ELEMENT_NONE; }
+
 } // namespace
 
 int zel_svc_element_push(ZelSvcElementId id) { return is_row(id) && state().push(id) ? 1 : 0; }
@@ -42,13 +45,13 @@ void zel_svc_element_clear_enabled() {
 int zel_svc_element_enable(ZelSvcElementId id) {
     if (state().enabled_count == ZEL_SVC_ELEMENT_MAX_ENABLED) return 0;
     if (state().enabled_count++ == 0) state().disabled.fill(true);
-    if (is_row(id)) state().disabled[static_cast<std::size_t>(id)] = false;
+    if (may_be_listed(id)) state().disabled[static_cast<std::size_t>(id)] = false;
     return 1;
 }
 
 int zel_svc_element_is_enabled(ZelSvcElementId id) {
     if (state().enabled_count == 0) return 1;
-    return is_row(id) && !state().disabled[static_cast<std::size_t>(id)] ? 1 : 0;
+    return may_be_listed(id) && !state().disabled[static_cast<std::size_t>(id)] ? 1 : 0;
 }
 
 void zel_svc_element_set_stop(ZelSvcElementId id) { state().stop = id; }
