@@ -47,6 +47,10 @@ Row columns_of(const Json &list) {
         for (const auto &[name, value] : element.items())
             if (!repeats_another(element, name) && std::find(columns.begin(), columns.end(), name) == columns.end())
                 columns.push_back(name);
+    // What an entry is comes first, what it is like behind it.
+    std::stable_partition(columns.begin(), columns.end(), [](const std::string &name) {
+        return name == "path" || name == "key" || name == "name" || name == "function";
+    });
     return columns;
 }
 
@@ -67,7 +71,7 @@ void print_answer(const Json &answer, bool reveal) {
     if (is_list_of_objects(answer)) return print_list(answer, reveal);
     if (!answer.is_object()) return print_line(answer.is_string() ? answer.get<std::string>() : answer.dump());
     // A file's content is printed as it is.
-    if (answer.contains("text") && answer.contains("path")) return print(bytes_of(answer, "text"));
+    if (answer.contains("content") && answer.contains("path")) return print(bytes_of(answer, "content"));
     std::vector<Row> rows;
     add_members(rows, answer, "", reveal);
     print_table({}, rows);

@@ -73,6 +73,7 @@ std::vector<Command> own_commands() {
          .help = "Print the run log: what installs and upgrades did.",
          .access = Access::kReads,
          .run = log},
+        {.name = "manual", .help = "Print the manual page: zel manual | man -l -", .run = manual},
         {.name = "vconf get",
          .parameters = {positional("KEY", "such as db/zel/salescode")},
          .help = "Print the value of a key of the settings store.",

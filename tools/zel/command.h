@@ -13,7 +13,7 @@ namespace zel_command {
 // Scripts rely on these: they are in the manual page and never change.
 enum ExitCode : int { kDone = 0, kFailed = 1, kUsage = 2, kNoRoot = 3, kDifferences = 4 };
 
-// Whether a command needs a phone, and whether it may run beside others on the same phone.
+// Whether a command needs a phone, and whether it changes it: one command at a time does.
 enum class Access { kNone, kReads, kWrites };
 
 struct Parameter {

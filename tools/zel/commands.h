@@ -33,6 +33,9 @@ int vconf_list(Invocation &invocation);
 // phone-verbs.cpp
 int phone_verb(Invocation &invocation);
 
+// manual.cpp
+int manual(Invocation &invocation);
+
 // completion.cpp
 int completion_bash(Invocation &invocation);
 

@@ -3,7 +3,6 @@
 
 #include "command.h"
 #include "phone.h"
-#include "root.h"
 
 #include <map>
 #include <string>

@@ -26,7 +26,7 @@ int run_log(const Invocation &invocation) {
                       std::string{"cannot read "} + ZEL_SVC_RUN_LOG_PATH + " of the phone in '" + invocation.root +
                           "': " + bytes_of(answer, "error"),
                       "Nothing was installed on this phone yet; 'zel install CUSTOMER' writes this log."};
-    const std::string text = bytes_of(answer, "text");
+    const std::string text = bytes_of(answer, "content");
     if (invocation.json)
         print_run_log_json(text);
     else

@@ -3,6 +3,7 @@
 #include "command-line.h"
 #include "failure.h"
 #include "output.h"
+#include "root.h"
 
 #include <exception>
 
@@ -15,13 +16,12 @@ int run(int argc, char **argv) {
     const int parsed = parse_command_line(argc, argv, invocation);
     if (parsed >= 0) return parsed;
 
-    RootLock lock;
     const Command &command = *invocation.command;
     if (command.access != Access::kNone) {
         invocation.root = choose_root(invocation.root_option);
         invocation.phone = Phone::open(invocation.root);
-        lock = RootLock{invocation.root, command.access};
     }
+    if (command.access == Access::kWrites) invocation.phone.lock(command.name);
     return command.run(invocation);
 }
 

@@ -2,12 +2,24 @@
 
 #include "answer-page.h"
 #include "commands.h"
+#include "root.h"
 
 #include <algorithm>
+#include <array>
 #include <cstdlib>
 
 namespace zel_command {
 namespace {
+
+// Verbs that only look: they run beside a command that changes the phone. Any other takes the phone's lock.
+constexpr std::array<std::string_view, 9> kLookingVerbs{"status",    "stat",       "tree",       "read",     "log",
+                                                        "vconf-get", "vconf-list", "fault-list", "tool-list"};
+
+Access access_of(const std::string &verb, bool needs_phone) {
+    if (!needs_phone) return Access::kNone;
+    const bool looks = std::find(kLookingVerbs.begin(), kLookingVerbs.end(), verb) != kLookingVerbs.end();
+    return looks ? Access::kReads : Access::kWrites;
+}
 
 std::string upper_case(std::string text) {
     std::transform(text.begin(), text.end(), text.begin(),
@@ -22,7 +34,7 @@ Parameter parameter_of(const Json &argument) {
     result.argument = name;
     result.integer = type == "integer";
     result.form = type == "boolean" ? Parameter::Form::kFlag : Parameter::Form::kOption;
-    if (type != "boolean") result.value = result.integer ? "N" : "TEXT";
+    if (type != "boolean") result.value = result.integer ? "N" : name == "package" ? "DIR" : "TEXT";
     if (!result.required || type == "boolean") return result;
     result.form = Parameter::Form::kPositional;
     result.name = upper_case(name);
@@ -34,7 +46,7 @@ Command command_of(const Json &row) {
     const std::string verb = row.value("name", "");
     Command command{.name = "phone " + verb,
                     .help = row.value("help", "") + ".",
-                    .access = row.value("needs_phone", true) ? Access::kWrites : Access::kNone,
+                    .access = access_of(verb, row.value("needs_phone", true)),
                     .run = phone_verb,
                     .verb = verb};
     for (const Json &argument : row.value("arguments", Json::array()))

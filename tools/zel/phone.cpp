@@ -2,6 +2,8 @@
 
 #include "failure.h"
 
+#include <unistd.h>
+
 namespace zel_command {
 namespace {
 
@@ -25,6 +27,14 @@ Phone Phone::open(const std::string &root) {
     if (phone.phone_) return phone;
     throw Failure{kNoRoot, error != nullptr ? error : "cannot open the phone in '" + root + "'",
                   "Make one with 'zel --root DIR phone create', DIR being a new or empty folder."};
+}
+
+void Phone::lock(const std::string &command) const {
+    Json answer;
+    const std::string holder = "'zel " + command + "', process " + std::to_string(getpid());
+    if (try_call("lock", {{"holder", holder}}, answer) == 0) return;
+    throw Failure{kFailed, command + ": cannot lock the phone: " + error_in(answer),
+                  "Wait until it has finished, or work on another phone."};
 }
 
 int Phone::try_call(const std::string &verb, const Json &arguments, Json &answer) const {

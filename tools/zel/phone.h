@@ -17,6 +17,10 @@ class Phone {
     static Phone open(const std::string &root);
     Phone() = default;
 
+    // Keeps other commands that change the phone off it for as long as this one is open; throws a Failure that
+    // says who holds it. `command` is what they are told about this one.
+    void lock(const std::string &command) const;
+
     // Runs one verb of the bench phone. Throws a Failure with the phone's own words. The verbs that work
     // without a phone ("create", "verbs") may be called on an empty Phone.
     [[nodiscard]] Json call(const std::string &verb, const Json &arguments = Json::object()) const;

@@ -2,6 +2,8 @@
 
 #include "secrets.h"
 
+#include <algorithm>
+
 namespace zel_command {
 namespace {
 
@@ -40,17 +42,47 @@ void print_settings(const Json &settings) {
     print_table({}, rows);
 }
 
+// An operator has up to dozens of MCC+MNC with the same profiles: the page shows the first few, and the
+// profiles once.
+constexpr std::size_t kShownCodes = 6;
+
+struct NamedNetwork {
+    std::string name;
+    std::vector<std::string> codes;
+    Json profiles;
+};
+
+std::vector<NamedNetwork> by_name(const Json &networks) {
+    std::vector<NamedNetwork> result;
+    for (const Json &network : networks) {
+        const std::string name = bytes_of(network, "name");
+        auto found =
+            std::find_if(result.begin(), result.end(), [&](const NamedNetwork &known) { return known.name == name; });
+        if (found == result.end()) found = result.insert(result.end(), {name, {}, Json::array()});
+        found->codes.push_back(bytes_of(network, "mccmnc"));
+        if (found->profiles.empty()) found->profiles = network["profiles"];
+    }
+    return result;
+}
+
+std::string codes_text(const std::vector<std::string> &codes) {
+    std::string result;
+    for (std::size_t i = 0; i < codes.size() && i < kShownCodes; ++i)
+        result += (i == 0 ? "" : " ") + codes[i];
+    return codes.size() <= kShownCodes ? result : result + " +" + std::to_string(codes.size() - kShownCodes) + " more";
+}
+
 void print_networks(const Json &sims) {
     for (const Json &sim : sims) {
         std::vector<std::vector<std::string>> rows;
-        for (const Json &network : sim["networks"]) {
-            rows.push_back({"  " + bytes_of(network, "name"), bytes_of(network, "mccmnc")});
-            for (const Json &profile : network["profiles"])
+        for (const NamedNetwork &network : by_name(sim["networks"])) {
+            rows.push_back({"  " + network.name, codes_text(network.codes)});
+            for (const Json &profile : network.profiles)
                 rows.push_back({"    " + bytes_of(profile, "name"), bytes_of(profile, "apn"),
                                 bytes_of(profile, "service"), profile.value("default", false) ? "default" : ""});
         }
         if (rows.empty()) continue;
-        print_title("Networks and their profiles, SIM " + sim["sim"].dump());
+        print_title("Networks (MCC+MNC) and their profiles (APN), SIM " + sim["sim"].dump());
         print_table({}, rows);
     }
 }

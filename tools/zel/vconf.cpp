@@ -77,8 +77,8 @@ int vconf_set(Invocation &invocation) {
     const std::string text = invocation.value("VALUE");
     const std::string type = type_for(invocation, key);
     check_value(key, text, type);
-    Json arguments{{"key", key}, {"type", type}};
-    put_text(arguments, "value", text);
+    Json arguments{{"key", key}, {"type", type}, {"value", text}};
+    if (!is_utf8(text)) arguments["value-hex"] = to_hex(text);
     const Json answer = invocation.phone.call("vconf-set", arguments);
     if (invocation.json) print_json(answer);
     return kDone;
