@@ -282,6 +282,31 @@ TEST_F(SecurityLock, StartsTheSecurityGroupAfreshAndNoOther) {
     EXPECT_TRUE(group_is_marked("gps"));
 }
 
+TEST_F(SecurityLock, IsThatOfTheActiveCustomersFolder) {
+    set_string("db/zel/salescode", "UFN");
+    write_customer("TFG", "<Settings><Main><Security><NbNetworkLock>2</NbNetworkLock><NetworkLock>00101</NetworkLock>"
+                          "<NetworkLock>00102</NetworkLock><AutoSIMLock>on</AutoSIMLock><UnlockCnt>5</UnlockCnt>"
+                          "</Security></Main></Settings>");
+    EXPECT_EQ(ask(), 1);
+    EXPECT_EQ(locks_.network_lock_count, 2);
+    EXPECT_STREQ(locks_.network_locks[0], "00101");
+    EXPECT_STREQ(locks_.network_locks[1], "00102");
+    EXPECT_EQ(locks_.auto_sim_lock, 1);
+    EXPECT_EQ(locks_.unlock_count, 5);
+    EXPECT_NE(read(data_path("security")).find("net_lock_count"), std::string::npos);
+}
+
+TEST_F(SecurityLock, OfAFileWithoutLocksIsEmptyAndNotAnEarlierCustomers) {
+    write_customer("XFV", "<Settings><Main><Security><UnlockCnt>5</UnlockCnt></Security></Main></Settings>");
+    write_customer("BTU", "<Settings><Main></Main></Settings>");
+    set_string("db/zel/salescode", "XFV");
+    EXPECT_EQ(ask(), 1);
+    EXPECT_EQ(locks_.unlock_count, 5);
+    set_string("db/zel/salescode", "BTU");
+    EXPECT_EQ(ask(), 1);
+    EXPECT_TRUE(empty());
+}
+
 class InstallHeader : public PackageQuery {};
 
 TEST_F(InstallHeader, WritesNameAndVersionBetweenItsLines) {
