@@ -224,6 +224,7 @@ TEST_P(CodeWithoutFolder, InstallsNothingAndWritesAllLines) {
         write("/opt/system/zel/" + std::string(folder) + "power-ani/poweron.edj", "");
         write("/opt/system/zel/" + std::string(folder) + "usr/file", "");
     }
+    write("/poweron.edj", "");
     zel_svc_config_install_customer(GetParam(), ZEL_SVC_INSTALL_CONFIG_MODE);
     EXPECT_EQ(get_string("db/zel/country_iso"), std::nullopt);
     EXPECT_EQ(get_string("db/zel/power_ani_file_path"), std::nullopt);
