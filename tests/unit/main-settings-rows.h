@@ -1,42 +1,10 @@
 #pragma once
-// The settings of one key or two that take a fixed set of words, written down a second time from the
-// product's vocabulary: the library's rows must agree with this copy.
+// The words, keys and records of the main settings and of the packet service's switches.
 
-#include "spec/zel-svc-data.h"
-#include "spec/zel-svc-element-id.h"
-
-#include <ostream>
-#include <span>
-#include <string_view>
+#include "word-setting.h"
 
 namespace zel_test {
 
-struct ExpectedWord {
-    std::string_view text;
-    int number;
-};
-
-struct ExpectedRecord {
-    const char *section = nullptr;
-    const char *key = nullptr;
-};
-
-struct ExpectedSetting {
-    ZelSvcElementId element;
-    const char *tag;
-    bool is_boolean;
-    std::span<const ExpectedWord> words;
-    const char *keys[2]; // the second may be null
-    ZelSvcDataGroup group;
-    ExpectedRecord records[2];
-    const char *label; // of the result line
-    bool unreadable_adds_line;
-    bool exported_when_recorded_only;
-
-    friend void PrintTo(const ExpectedSetting &setting, std::ostream *out) { *out << setting.tag; }
-};
-
-inline constexpr ExpectedWord kSwitchWords[] = {{"on", 1}, {"off", 0}};
 inline constexpr ExpectedWord kPredictionWords[] = {{"enable", 1}, {"disable", 0}};
 inline constexpr ExpectedWord kDateWords[] = {{"ddmmyyyy", 0}, {"mmddyyyy", 1}, {"yyyymmdd", 2}};
 inline constexpr ExpectedWord kTimeWords[] = {{"12h", 1}, {"24h", 2}};
