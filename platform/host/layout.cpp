@@ -26,6 +26,7 @@ CREATE TABLE tool (path TEXT PRIMARY KEY, status INTEGER NOT NULL, file TEXT NOT
 
 // The telephony side reads pdp_profile by position: columns 24 and 25 follow one that only it writes.
 constexpr const char *kNetworkTables = R"(
+BEGIN;
 CREATE TABLE network_info (network_info_id INTEGER PRIMARY KEY, network_name TEXT, mccmnc TEXT);
 CREATE TABLE pdp_profile (
   profile_id INTEGER PRIMARY KEY, profile_name TEXT, apn TEXT, auth_type INTEGER, auth_id TEXT, auth_pwd TEXT,
@@ -38,6 +39,7 @@ CREATE TABLE fast_dormancy (
   dormant_id INTEGER PRIMARY KEY, network_info_id INTEGER, lcd_on_timeout INTEGER, lcd_off_timeout INTEGER,
   lcd_on_timeout_rel8 INTEGER, lcd_off_timeout_rel8 INTEGER);
 CREATE TABLE max_pdp (max_id INTEGER PRIMARY KEY, network_info_id INTEGER, max_pdp_3g INTEGER);
+COMMIT;
 )";
 
 constexpr const char *kFolders[] = {
@@ -91,6 +93,7 @@ void make_network_database(Phone &phone, const char *path) {
     const Fd file(::openat(name.folder.get(), name.name.c_str(), O_WRONLY | O_CREAT | O_EXCL | O_CLOEXEC, 0660));
     sqlite3 *database = nullptr;
     int result = sqlite3_open_v2(real_path(file.get()).c_str(), &database, SQLITE_OPEN_READWRITE, nullptr);
+    if (result == SQLITE_OK) result = sqlite3_exec(database, "PRAGMA synchronous=OFF", nullptr, nullptr, nullptr);
     if (result == SQLITE_OK) result = sqlite3_exec(database, kNetworkTables, nullptr, nullptr, nullptr);
     sqlite3_close(database);
     if (result != SQLITE_OK) throw StoreError(std::string("cannot make '") + path + "'");

@@ -54,7 +54,7 @@ bool steps_into_state(std::string_view path) {
 }
 
 // Most paths hold no link: the kernel takes them in one call, and the text alone says whether the state
-// folder is met. Any other answer than a descriptor or "nothing there" is left to the walk.
+// folder is met.
 int open_without_links(int root, const std::string &path) {
     open_how how{};
     how.flags = O_PATH | O_CLOEXEC;
@@ -191,6 +191,19 @@ bool same_file(int a, int b) {
            first.st_ino == second.st_ino;
 }
 
+// Resolves a path without links. False when there is one, or anything else that only the walk can tell.
+bool resolve_at_once(int root, std::string_view path, Place &place) {
+    place.file = Fd(open_without_links(root, std::string(path)));
+    if (place.file) return true;
+    const std::size_t cut = path.rfind('/') + 1;
+    if (errno != ENOENT || !plain_name(path.substr(cut))) return false;
+    place.missing_in = Fd(open_without_links(root, std::string(path.substr(0, cut))));
+    if (place.missing_in && !is_folder(place.missing_in.get())) return false;
+    if (place.missing_in) place.name = path.substr(cut);
+    place.error = ENOENT;
+    return true;
+}
+
 } // namespace
 
 Place resolve(int root, std::string_view path, Follow follow) {
@@ -198,10 +211,7 @@ Place resolve(int root, std::string_view path, Follow follow) {
     if (!path.starts_with('/')) place.error = path.empty() ? ENOENT : EINVAL;
     if (path.size() >= PATH_MAX) place.error = ENAMETOOLONG;
     if (place.error != 0) return place;
-    if (!walk_only() && !steps_into_state(path)) {
-        place.file = Fd(open_without_links(root, std::string(path)));
-        if (place.file) return place;
-    }
+    if (!walk_only() && !steps_into_state(path) && resolve_at_once(root, path, place)) return place;
     return Walk(root, path, follow).run();
 }
 

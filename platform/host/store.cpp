@@ -99,7 +99,7 @@ sqlite3 *Store::database() {
         throw StoreError("cannot open '" + file_ + "': " + reason);
     }
     sqlite3_busy_timeout(database_, kBusyWaitMs);
-    execute("PRAGMA journal_mode=WAL; PRAGMA synchronous=OFF; PRAGMA temp_store=MEMORY");
+    execute("PRAGMA synchronous=OFF; PRAGMA journal_mode=WAL; PRAGMA temp_store=MEMORY");
     return database_;
 }
 

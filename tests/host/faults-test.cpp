@@ -7,6 +7,7 @@
 #include <device-power.h>
 #include <dlog.h>
 #include <fcntl.h>
+#include <gmock/gmock.h>
 #include <security-server.h>
 #include <smack.h>
 #include <sys/wait.h>

@@ -9,6 +9,7 @@
 #include <fcntl.h>
 #include <filesystem>
 #include <fstream>
+#include <gmock/gmock.h>
 #include <sys/socket.h>
 #include <sys/stat.h>
 #include <sys/un.h>

@@ -8,6 +8,7 @@
 #include <device-power.h>
 #include <dlog.h>
 #include <filesystem>
+#include <gmock/gmock.h>
 #include <sys/wait.h>
 #include <theme.h>
 #include <unistd.h>
