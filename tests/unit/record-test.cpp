@@ -27,6 +27,7 @@ struct Item {
 };
 
 std::int32_t doubled(std::string_view text) { return 2 * std::stoi(std::string{text}); }
+std::string halved(std::int32_t number) { return std::to_string(number / 2); }
 bool hidden_is_on(std::string_view spec, std::string_view phone) { return spec == "on" && phone == "hidden"; }
 
 // The element ids stand for themselves only: the table is this test's own.
@@ -42,9 +43,10 @@ constexpr Field<Item> kFields[] = {
     field<&Item::type>(ZEL_SVC_ELEMENT_MAILBOX_TYPE, {.accepts = kept_words(kTypes), .record = {"type_%d"}}),
     field<&Item::port>(ZEL_SVC_ELEMENT_INCOMING_PORT, {.record = {"port", FieldForm::NumberIfGiven, "other"},
                                                        .report = {"Port", LineWhen::EitherGiven}}),
-    field<&Item::timeout>(ZEL_SVC_ELEMENT_TIMEOUT_VALUE,
-                          {.record = {.key = "time_%d", .form = FieldForm::NumberIfGiven, .reads = doubled},
-                           .report = {"Hidden", LineWhen::Always, hidden_is_on}}),
+    field<&Item::timeout>(
+        ZEL_SVC_ELEMENT_TIMEOUT_VALUE,
+        {.record = {.key = "time_%d", .form = FieldForm::NumberIfGiven, .reads = doubled, .shows = halved},
+         .report = {"Hidden", LineWhen::Always, hidden_is_on}}),
 };
 
 Occurrence occurrence_of(ZelSvcElementId element, ZelSvcParseAction action, std::string_view text) {
@@ -224,6 +226,51 @@ TEST_F(RecordShape, UnknownWordIsRecordedAsTheRowSays) {
     save(item, 1);
     EXPECT_EQ(group.text("bookmark", "editable_1"), std::nullopt);
     EXPECT_EQ(group.number("bookmark", "login_1"), 0);
+}
+
+TEST_F(RecordShape, SavedRecordIsLoadedAsItWas) {
+    const LoadedGroup group{ZEL_SVC_DATA_BOOKMARK};
+    Item item;
+    item.name.assign("News");
+    item.url.assign("http://a");
+    item.editable.assign("no");
+    item.login.assign("on");
+    item.type.assign("pop3");
+    item.port.assign("110");
+    item.timeout.assign("21");
+    save(item, 12);
+    Item loaded;
+    loaded.url.assign("an older and longer one");
+    zel_svc_record_load<Item>(ZEL_SVC_DATA_BOOKMARK, "bookmark", kFields, loaded, 12);
+    EXPECT_EQ(loaded.name.view(), "News");
+    EXPECT_EQ(loaded.url.view(), "http://a");
+    EXPECT_EQ(loaded.editable.view(), "no");
+    EXPECT_EQ(loaded.login.view(), "on");
+    EXPECT_EQ(loaded.type.view(), "pop3");
+    EXPECT_EQ(loaded.port.view(), "110");
+    EXPECT_EQ(loaded.timeout.view(), "21");
+}
+
+TEST_F(RecordShape, AbsentEntriesAreLoadedEmpty) {
+    const LoadedGroup group{ZEL_SVC_DATA_BOOKMARK};
+    Item item;
+    for (FixedText<20> *text : {&item.url, &item.editable, &item.login, &item.type, &item.port, &item.timeout})
+        text->assign("old");
+    zel_svc_record_load<Item>(ZEL_SVC_DATA_BOOKMARK, "bookmark", kFields, item, 1);
+    for (const FixedText<20> *text : {&item.url, &item.editable, &item.login, &item.type, &item.port, &item.timeout})
+        EXPECT_EQ(text->view(), "");
+}
+
+TEST_F(RecordShape, NumbersThatStandForNothingAreLoadedEmpty) {
+    const LoadedGroup group{ZEL_SVC_DATA_BOOKMARK};
+    zel_svc_data_set_int(ZEL_SVC_DATA_BOOKMARK, "bookmark", "editable_1", 2);
+    zel_svc_data_set_int(ZEL_SVC_DATA_BOOKMARK, "bookmark", "time_1", -1);
+    zel_svc_data_set_int(ZEL_SVC_DATA_BOOKMARK, "other", "port", -2);
+    Item item;
+    zel_svc_record_load<Item>(ZEL_SVC_DATA_BOOKMARK, "bookmark", kFields, item, 1);
+    EXPECT_EQ(item.editable.view(), "");
+    EXPECT_EQ(item.timeout.view(), "");
+    EXPECT_EQ(item.port.view(), "-2");
 }
 
 TEST_F(RecordShape, SavingTellsWhetherItWrote) {

@@ -36,6 +36,14 @@ std::optional<std::int32_t> number_of(const FieldRules &rules, std::string_view 
     return rules.record.reads ? rules.record.reads(text) : zel_svc_number_from_text(text);
 }
 
+constexpr std::int32_t kAbsent = -1;
+
+std::string shown(const FieldRules &rules, std::int32_t value) {
+    if (rules.record.form == FieldForm::Word) return zel_svc_accepts_text(rules.accepts, value).value_or("");
+    if (value == kAbsent) return {};
+    return rules.record.shows ? rules.record.shows(value) : zel_svc_number_text(value);
+}
+
 } // namespace
 
 bool zel_svc_field_save(ZelSvcDataGroup group, const char *section, const FieldRules &rules, int number,
@@ -53,6 +61,17 @@ bool zel_svc_field_save(ZelSvcDataGroup group, const char *section, const FieldR
     if (!value) return false;
     zel_svc_data_set_int(group, where, key.c_str(), *value);
     return true;
+}
+
+void zel_svc_field_load(ZelSvcDataGroup group, const char *section, const FieldRules &rules, int number,
+                        FieldText text) {
+    const FieldRecord &record = rules.record;
+    if (!record.key) return;
+    const char *where = record.section ? record.section : section;
+    const std::string key = key_of(record.key, number);
+    if (is_text(record.form)) return text.assign(zel_svc_data_get_text(group, where, key.c_str()));
+    if (!zel_svc_data_find(group, where, key.c_str())) return text.assign({});
+    text.assign(shown(rules, zel_svc_data_get_int(group, where, key.c_str(), kAbsent)));
 }
 
 int zel_svc_record_count_up(ZelSvcDataGroup group, const char *section) {

@@ -28,6 +28,7 @@
 #include <new>
 #include <optional>
 #include <span>
+#include <string>
 #include <string_view>
 #include <utility>
 
@@ -49,9 +50,11 @@ enum class FieldForm {
 struct FieldRecord {
     const char *key = nullptr;
     FieldForm form = FieldForm::Text;
-    const char *section = nullptr;                     // where it is not the record's own
-    std::optional<std::int32_t> otherwise = {};        // Word; without it other texts are not recorded
-    std::int32_t (*reads)(std::string_view) = nullptr; // NumberIfGiven; null: a decimal number
+    const char *section = nullptr;              // where it is not the record's own
+    std::optional<std::int32_t> otherwise = {}; // Word; without it other texts are not recorded
+    // NumberIfGiven that is no plain decimal number: its reading and, for a load, the way back.
+    std::int32_t (*reads)(std::string_view) = nullptr;
+    std::string (*shows)(std::int32_t) = nullptr;
 };
 
 // When a field's result line is written and when it passes.
@@ -172,6 +175,19 @@ void zel_svc_record_save(ZelSvcDataGroup group, const char *section, std::span<c
                          int number) {
     for (const Field<R> &field : fields)
         zel_svc_field_save(group, section, field.rules, number, field.of(record).view());
+}
+
+// Fills one field with what the section store keeps of item `number`, as the text of the spec: the word of a
+// number, the number itself. What is absent, a number of -1 and one that no word stands for leave it empty.
+void zel_svc_field_load(ZelSvcDataGroup group, const char *section, const FieldRules &rules, int number,
+                        FieldText text);
+
+// Loads every field that has a record key; the others stay as they are.
+template <class R>
+void zel_svc_record_load(ZelSvcDataGroup group, const char *section, std::span<const Field<R>> fields, R &record,
+                         int number) {
+    for (const Field<R> &field : fields)
+        zel_svc_field_load(group, section, field.rules, number, field.of(record));
 }
 
 // Raises the section's "count" by one and returns it: the number of the item to be written.
