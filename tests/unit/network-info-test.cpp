@@ -218,6 +218,29 @@ TEST_F(NetworkInfo, RefusedRenameFails) {
     EXPECT_EQ(rows(), (SqliteRows{{"5", "Old", "26201"}}));
 }
 
+TEST_F(NetworkInfo, RefusedBindFails) {
+    run("insert into network_info values(5, 'Old', '26201')");
+    fail("sqlite3_bind_text");
+    EXPECT_EQ(get_id("New", "26201", kCreate), kFailed);
+    EXPECT_EQ(get_id("Two", "26202", kCreate), kFailed);
+    EXPECT_EQ(get_id("Old", "26201", kLookUp), kFailed);
+    EXPECT_EQ(rows(), (SqliteRows{{"5", "Old", "26201"}}));
+}
+
+TEST_F(NetworkInfo, MaximumThatFailsWhileItRunsInsertsNothing) {
+    fail("sqlite3_step", "select max(network_info_id)");
+    EXPECT_EQ(get_id("One", "26201", kCreate), kFailed);
+    EXPECT_THAT(rows(), IsEmpty());
+}
+
+// An unknown collation refuses the maximum alone; the insert is attempted all the same.
+TEST_F(NetworkInfo, MaximumThatCannotBePreparedFailsButLeavesARow) {
+    run("drop table network_info");
+    run("create table network_info(network_info_id integer collate none_such, network_name text, mccmnc text)");
+    EXPECT_EQ(get_id("One", "26201", kCreate), kFailed);
+    EXPECT_EQ(SqliteFile{file()}.rows("select * from network_info"), (SqliteRows{{"0", "One", "26201"}}));
+}
+
 TEST_F(NetworkInfo, NoIdFollowsTheLargestInteger) {
     run("insert into network_info values(2147483646, 'Old', '20801')");
     EXPECT_EQ(get_id("One", "26201", kCreate), (Answer{1, 2147483647}));
