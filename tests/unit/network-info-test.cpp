@@ -236,7 +236,9 @@ TEST_F(NetworkInfo, MaximumThatFailsWhileItRunsInsertsNothing) {
 // An unknown collation refuses the maximum alone; the insert is attempted all the same.
 TEST_F(NetworkInfo, MaximumThatCannotBePreparedFailsButLeavesARow) {
     run("drop table network_info");
-    run("create table network_info(network_info_id integer collate none_such, network_name text, mccmnc text)");
+    run("create table network_info(network_info_id integer, network_name text, mccmnc text)");
+    run("pragma writable_schema=on; update sqlite_master set sql='create table network_info(network_info_id integer "
+        "collate none_such, network_name text, mccmnc text)' where name='network_info'");
     EXPECT_EQ(get_id("One", "26201", kCreate), kFailed);
     EXPECT_EQ(SqliteFile{file()}.rows("select * from network_info"), (SqliteRows{{"0", "One", "26201"}}));
 }
