@@ -142,7 +142,7 @@ TEST_F(BootMode, NullDoesNothing) {
 TEST_F(BootMode, RebootRestartsThePhone) {
     zel_svc_config_reboot();
     const nlohmann::json status = call("status");
-    EXPECT_EQ(status.at("restarts"), 1);
+    EXPECT_EQ(status.at("restarts_asked"), 1);
     EXPECT_EQ(status.at("restart_command"), 0x01234567);
 }
 

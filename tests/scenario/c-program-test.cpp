@@ -23,7 +23,7 @@ TEST_F(CProgram, UsesEveryFunction) {
     write_customer("XFV", "<GeneralInfo><CountryISO>ZA</CountryISO></GeneralInfo>");
     EXPECT_EQ(run(), 0);
     EXPECT_EQ(get_string("db/zel/country_iso"), "ZA");
-    EXPECT_EQ(call("status").at("restarts"), 1);
+    EXPECT_EQ(call("status").at("restarts_asked"), 1);
 }
 
 TEST_F(CProgram, NoticesWrongAnswers) {
