@@ -1,5 +1,5 @@
 #pragma once
-// When does an item of the spec apply? Three questions, asked by every group whose data may come from the
+// When does an item of the spec apply? Questions that are asked by every group whose data may come from the
 // SIM card instead of the specification.
 
 #include "spec/zel-svc-occurrence.h"
@@ -16,6 +16,10 @@ enum class Wildcard { None, DefaultIsEverybodys };
 // Whether an item's network name is that of the operator being installed. An empty name is nobody's; a
 // group may take the name "default" for every operator's.
 bool zel_svc_is_current_operators(std::string_view network_name, Wildcard wildcard = Wildcard::None);
+
+// Install of an item that serves one network: a full install takes it as soon as its group applies, an
+// operator install only when it is the operator's own.
+bool zel_svc_item_applies(const Occurrence &occurrence, ZelSvcAutoFlag flag, std::string_view network_name);
 
 inline bool zel_svc_is_every_network(std::string_view network_name) {
     return network_name.empty() || network_name == "default";

@@ -27,15 +27,6 @@ std::string key_of(const char *format, int number) {
 
 bool is_text(FieldForm form) { return form == FieldForm::Text || form == FieldForm::TextIfGiven; }
 
-std::optional<std::int32_t> number_of(const FieldRules &rules, std::string_view text) {
-    if (rules.record.form == FieldForm::Word) {
-        const auto value = zel_svc_accepts_value(rules.accepts, text);
-        return value ? value : rules.record.otherwise;
-    }
-    if (text.empty()) return std::nullopt;
-    return rules.record.reads ? rules.record.reads(text) : zel_svc_number_from_text(text);
-}
-
 constexpr std::int32_t kAbsent = -1;
 
 std::string shown(const FieldRules &rules, std::int32_t value) {
@@ -45,6 +36,15 @@ std::string shown(const FieldRules &rules, std::int32_t value) {
 }
 
 } // namespace
+
+std::optional<std::int32_t> zel_svc_field_number(const FieldRules &rules, std::string_view text) {
+    if (rules.record.form == FieldForm::Word) {
+        const auto value = zel_svc_accepts_value(rules.accepts, text);
+        return value ? value : rules.record.otherwise;
+    }
+    if (text.empty()) return std::nullopt;
+    return rules.record.reads ? rules.record.reads(text) : zel_svc_number_from_text(text);
+}
 
 bool zel_svc_field_save(ZelSvcDataGroup group, const char *section, const FieldRules &rules, int number,
                         std::string_view text) {
@@ -57,7 +57,7 @@ bool zel_svc_field_save(ZelSvcDataGroup group, const char *section, const FieldR
         zel_svc_data_set_str(group, where, key.c_str(), text);
         return true;
     }
-    const std::optional<std::int32_t> value = number_of(rules, text);
+    const std::optional<std::int32_t> value = zel_svc_field_number(rules, text);
     if (!value) return false;
     zel_svc_data_set_int(group, where, key.c_str(), *value);
     return true;

@@ -164,6 +164,9 @@ template <class R> class OpenRecord {
     std::unique_ptr<R> record_;
 };
 
+// The number that a field of the form Word or NumberIfGiven records for a text; nothing when it records none.
+std::optional<std::int32_t> zel_svc_field_number(const FieldRules &rules, std::string_view text);
+
 // Writes one field of item number `number` to the section store in the form that its rules name. False when
 // there was nothing to write.
 bool zel_svc_field_save(ZelSvcDataGroup group, const char *section, const FieldRules &rules, int number,

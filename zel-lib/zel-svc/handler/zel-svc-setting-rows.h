@@ -30,6 +30,17 @@ constexpr Setting recorded(const SettingSection &section, ZelSvcElementId elemen
             .exports = if_recorded()};
 }
 
+// A setting that other components read from the section store: no key of the phone holds it, so it is neither
+// compared nor exported.
+constexpr Setting only_recorded(const SettingSection &section, ZelSvcElementId element, Accepts accepts,
+                                const char *record, RecordForm form = RecordForm::Number) {
+    return {.element = element, .accepts = accepts, .records = {{section.group, section.section, record, form}}};
+}
+constexpr Setting only_recorded_text(const SettingSection &section, ZelSvcElementId element, Accepts accepts,
+                                     const char *record) {
+    return only_recorded(section, element, accepts, record, RecordForm::SpecText);
+}
+
 // A switch whose key is a boolean.
 constexpr Setting recorded_switch(const SettingSection &section, ZelSvcElementId element, const char *key,
                                   const char *record) {
