@@ -68,6 +68,13 @@ std::vector<Command> own_commands() {
          .more = "Exits 1 when the phone states none.",
          .access = Access::kReads,
          .run = approval},
+        {.name = "locks",
+         .help = "Print the SIM locks that the active customer's file states.",
+         .more = "Writes: the group \"/opt/system/zel-default/data/zel-default-data-security.ini\" is started afresh "
+                 "with them. The counts are those that the file states; at most 70 codes of a kind are kept. Exits 1 "
+                 "without an active customer, or when its file cannot be read to its end.",
+         .access = Access::kWrites,
+         .run = locks},
         {.name = "log",
          .parameters = {flag("system", "the phone's system log in place of the run log")},
          .help = "Print the run log: what installs and upgrades did.",

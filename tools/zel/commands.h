@@ -18,6 +18,9 @@ int customers(Invocation &invocation);
 int version(Invocation &invocation);
 int approval(Invocation &invocation);
 
+// locks.cpp
+int locks(Invocation &invocation);
+
 // log.cpp
 int log(Invocation &invocation);
 
