@@ -3,6 +3,7 @@
 
 #include "support/bench-phone.h"
 
+#include <gmock/gmock.h>
 #include <ostream>
 #include <string>
 #include <sys/stat.h>
