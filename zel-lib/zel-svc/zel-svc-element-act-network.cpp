@@ -1,5 +1,7 @@
 #include "zel-svc-element-act-network.h"
 
+#include "handler/zel-svc-setting-rows.h"
+
 #include <vconf.h>
 
 namespace {
@@ -20,14 +22,7 @@ constexpr Setting auto_flag(ZelSvcElementId element) {
     return {.element = element, .accepts = on_off(), .install = set_flag, .verify = set_flag};
 }
 
-constexpr Setting packet_switch(ZelSvcElementId element, const char *key, const char *record) {
-    return {.element = element,
-            .accepts = on_off(),
-            .stores = {{KeyType::Int, key}},
-            .records = {{ZEL_SVC_DATA_NETWORK, "network", record}},
-            .report = text_in("Network"),
-            .exports = if_recorded()};
-}
+constexpr SettingSection kNetwork{ZEL_SVC_DATA_NETWORK, "network", "Network"};
 
 constexpr Setting kNetworkSettings[] = {
     auto_flag(ZEL_SVC_ELEMENT_AUTO_PROFILE),
@@ -40,8 +35,10 @@ constexpr Setting kNetworkSettings[] = {
     auto_flag(ZEL_SVC_ELEMENT_AUTO_FAST_DORMANCY),
     auto_flag(ZEL_SVC_ELEMENT_AUTO_WB_AMR),
     auto_flag(ZEL_SVC_ELEMENT_AUTO_MAX_PDP),
-    packet_switch(ZEL_SVC_ELEMENT_AUTO_ATTACH, "db/zel/network/ps_auto_attach", "ps_auto_attach"),
-    packet_switch(ZEL_SVC_ELEMENT_AUTO_DETACH, "db/zel/network/ps_auto_detach", "ps_auto_detach"),
+    recorded(kNetwork, ZEL_SVC_ELEMENT_AUTO_ATTACH, on_off(), int_key("db/zel/network/ps_auto_attach"),
+             "ps_auto_attach"),
+    recorded(kNetwork, ZEL_SVC_ELEMENT_AUTO_DETACH, on_off(), int_key("db/zel/network/ps_auto_detach"),
+             "ps_auto_detach"),
 };
 
 // Whether the SIM decides anything. E-mail accounts deliberately do not count.
