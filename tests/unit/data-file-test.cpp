@@ -189,6 +189,9 @@ struct StoredString {
     const char *name; // of the test
     std::string value;
     std::string loaded;
+
+    // The test's name in lists; without it they would show addresses.
+    friend void PrintTo(const StoredString &stored, std::ostream *out) { *out << stored.name; }
 };
 
 class LoadedBack : public DataFile, public ::testing::WithParamInterface<StoredString> {};
