@@ -63,6 +63,28 @@ TEST(GroupApplies, NeverInAnExport) {
     EXPECT_THAT(modes_of(ZEL_SVC_PARSE_ACTION_ENCODE, 1), IsEmpty());
 }
 
+TEST(ItemApplies, InstallsEveryNetworksInFullModeAndTheOperatorsInOperatorMode) {
+    set_operator("One");
+    for (const ZelSvcParseMode mode : kModes)
+        for (const std::int32_t flag : {0, 1})
+            for (const std::string_view name : {"One", "Two", "default", ""}) {
+                gbZelSvcNetworkAutoFlags.fill(flag);
+                const Occurrence end{.kind = OccurrenceKind::End, .action = ZEL_SVC_PARSE_ACTION_INSTALL, .mode = mode};
+                const bool expected = (mode == ZEL_SVC_PARSE_MODE_FULL && flag == 0) ||
+                                      (mode == ZEL_SVC_PARSE_MODE_OPERATOR && flag == 1 && name == "One");
+                EXPECT_EQ(zel_svc_item_applies(end, ZEL_SVC_AUTO_WB_AMR, name), expected) << mode << name;
+            }
+}
+
+TEST(ItemApplies, InInstallsOnly) {
+    gbZelSvcNetworkAutoFlags.fill(0);
+    for (const ZelSvcParseAction action : {ZEL_SVC_PARSE_ACTION_VERIFY, ZEL_SVC_PARSE_ACTION_ENCODE})
+        for (const ZelSvcParseMode mode : kModes) {
+            const Occurrence end{.kind = OccurrenceKind::End, .action = action, .mode = mode};
+            EXPECT_FALSE(zel_svc_item_applies(end, ZEL_SVC_AUTO_WB_AMR, "One"));
+        }
+}
+
 TEST(CurrentOperator, IsFoundByItsWholeName) {
     set_operator("One");
     EXPECT_TRUE(zel_svc_is_current_operators("One"));
