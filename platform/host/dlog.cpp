@@ -1,31 +1,10 @@
 #include "call.h"
 #include "system-log.h"
 
-#include <array>
 #include <cstdarg>
 #include <cstdio>
 #include <dlog.h>
 #include <string>
-
-namespace {
-
-[[gnu::format(printf, 1, 0)]] std::string formatted(const char *format, va_list values) {
-    std::array<char, 1024> text{};
-    va_list again;
-    va_copy(again, values);
-    const int size = std::vsnprintf(text.data(), text.size(), format, values);
-    const std::size_t length = size < 0 ? 0 : static_cast<std::size_t>(size);
-    std::string result(text.data(), std::min(length, text.size() - 1));
-    if (length >= text.size()) {
-        result.resize(length + 1);
-        static_cast<void>(std::vsnprintf(result.data(), result.size(), format, again));
-        result.resize(length);
-    }
-    va_end(again);
-    return result;
-}
-
-} // namespace
 
 using namespace zel_host;
 
@@ -34,8 +13,14 @@ ZEL_HOST_EXPORT int __dlog_print(int log_id, int priority, const char *tag, cons
     try {
         va_list values;
         va_start(values, format);
-        const std::string message = formatted(format, values);
+        const int size = std::vsnprintf(nullptr, 0, format, values);
         va_end(values);
+        if (size < 0) return -1;
+        std::string message(static_cast<std::size_t>(size) + 1, '\0');
+        va_start(values, format);
+        static_cast<void>(std::vsnprintf(message.data(), message.size(), format, values));
+        va_end(values);
+        message.pop_back();
         return answer<function("__dlog_print")>(
             [&](Phone &phone) { return write_log(phone, priority, tag == nullptr ? "" : tag, message); }, log_id,
             priority, tag, message.c_str());
