@@ -69,9 +69,10 @@ class Tree {
 
     void add_below(const std::string &path, int folder, std::int64_t depth) {
         if (depth > deepest_) return;
+        const std::string prefix = path + "/";
         const bool root = is_root(phone_, folder);
         for (const std::string &name : names_in(folder))
-            if (!root || name != kStateFolder) add(path + "/" + name, folder, name, depth);
+            if (!root || name != kStateFolder) add(std::string(prefix).append(name), folder, name, depth);
     }
 
     Json entries = Json::array();
