@@ -32,7 +32,8 @@ std::string shown(const Json &value) { return value.is_string() ? value.get<std:
 
 std::vector<std::string> keys(Phone &phone) {
     std::vector<std::string> lines;
-    for (const Json &key : phone.call("vconf-list").at("keys"))
+    const Json list = phone.call("vconf-list");
+    for (const Json &key : list.at("keys"))
         lines.push_back(key.at("type").get<std::string>() + " " + key.at("key").get<std::string>() + " = " +
                         shown(key.at("value")));
     std::sort(lines.begin(), lines.end());
@@ -44,7 +45,8 @@ std::vector<std::string> keys(Phone &phone) {
 std::vector<std::string> system_log(Phone &phone) {
     static const std::regex line_number{R"(^([^ ]+: [^ ]+\()\d+(\) > ))"};
     std::vector<std::string> lines;
-    for (const Json &entry : phone.call("log").at("lines")) {
+    const Json log = phone.call("log");
+    for (const Json &entry : log.at("lines")) {
         std::string message = entry.at("message").get<std::string>();
         message = std::regex_replace(message, line_number, "$1N$2");
         std::replace(message.begin(), message.end(), '\n', '|');

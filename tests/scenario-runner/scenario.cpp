@@ -14,6 +14,9 @@ namespace {
 
 namespace fs = std::filesystem;
 
+// The phone's clock stands still, so that laps and times are the same in every run.
+constexpr const char *kFrozenTime = "2026-01-05T08:00:00";
+
 Json create_arguments(const Scenario &scenario) {
     if (scenario.steps.empty() || scenario.steps.front().word != "create") return Json::object();
     return Json::parse(scenario.steps.front().rest);
@@ -61,7 +64,7 @@ Scenario read_scenario(const fs::path &folder) {
 }
 
 ScenarioRun::ScenarioRun(const Scenario &scenario) : scenario_{scenario}, phone_{create_arguments(scenario)} {
-    phone_.call("clock", {{"set", 1767600000}, {"mode", "stop"}});
+    phone_.call("clock", {{"stop", kFrozenTime}});
     const fs::path before = scenario.folder / "phone-before";
     if (fs::exists(before))
         fs::copy(before, phone_.root(), fs::copy_options::recursive | fs::copy_options::overwrite_existing);
@@ -72,7 +75,7 @@ void ScenarioRun::do_step(const ScenarioStep &step) {
     if (step.word == "package") {
         const fs::path package = step.rest == "example" ? fs::path{ZEL_SOURCE_DIR} / "examples/package"
                                                         : scenario_.folder / step.rest;
-        phone_.call("package", {{"dir", package.string()}});
+        phone_.call("package", {{"folder", package.string()}});
     } else if (step.word == "call") {
         const auto [verb, arguments] = split(step.rest);
         phone_.call(verb, arguments.empty() ? Json::object() : Json::parse(arguments));

@@ -28,6 +28,12 @@ void prepare(const Scenario &scenario, ScenarioRun &run, std::size_t end) {
         run.do_step(scenario.steps[i]);
 }
 
+// The text that picks out a journal entry's call. A log message is no text of its own: it holds line numbers.
+std::string picking_text(const Json &entry) {
+    const Json &text = entry.at("text");
+    return text.is_string() && entry.at("function") != "__dlog_print" ? text.get<std::string>() : std::string{};
+}
+
 // The distinct calls of a good run, in the order of their first appearance.
 std::vector<Call> journal_of_good_run(const Scenario &scenario, PhoneState &good) {
     const std::size_t last = last_run(scenario);
@@ -38,8 +44,9 @@ std::vector<Call> journal_of_good_run(const Scenario &scenario, PhoneState &good
     run.phone().call("journal-stop");
     std::vector<Call> calls;
     std::set<Call> seen;
-    for (const Json &entry : run.phone().call("journal-list").at("calls")) {
-        Call call{entry.at("function").get<std::string>(), entry.value("text", std::string{})};
+    const Json journal = run.phone().call("journal-list");
+    for (const Json &entry : journal.at("calls")) {
+        Call call{entry.at("function").get<std::string>(), picking_text(entry)};
         if (seen.insert(call).second) calls.push_back(std::move(call));
     }
     good = read_state(run.phone());
