@@ -1,4 +1,5 @@
 #include "program.h"
+#include "support/source-dir.h"
 
 #include <algorithm>
 #include <fstream>
@@ -24,7 +25,7 @@ std::size_t longest_line(const std::string &text) {
 }
 
 std::string manual_page() {
-    std::ifstream file{ZEL_SOURCE_DIR "/docs/man/zel.1"};
+    std::ifstream file{zel_test::source_dir() + "/docs/man/zel.1"};
     return std::regex_replace(std::string{std::istreambuf_iterator<char>{file}, {}}, std::regex{R"(\\-)"}, "-");
 }
 
@@ -83,7 +84,7 @@ TEST(ZelManual, HoldsEveryCommandAndOption) {
 }
 
 TEST(ZelManual, IsWhatTheCommandPrints) {
-    std::ifstream file{ZEL_SOURCE_DIR "/docs/man/zel.1"};
+    std::ifstream file{zel_test::source_dir() + "/docs/man/zel.1"};
     const std::string page{std::istreambuf_iterator<char>{file}, {}};
     EXPECT_EQ(run_zel({"manual"}).out, page) << "make the page anew with: zel manual > docs/man/zel.1";
 }

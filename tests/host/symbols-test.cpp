@@ -1,5 +1,6 @@
 // The library exports the functions that its headers declare, and nothing else.
 
+#include "support/source-dir.h"
 #include <cstdio>
 #include <dlfcn.h>
 #include <fstream>
@@ -14,7 +15,7 @@ namespace {
 
 std::string text_of(const std::string &file) {
     std::ostringstream text;
-    text << std::ifstream(ZEL_SOURCE_DIR + file).rdbuf();
+    text << std::ifstream(zel_test::source_dir() + file).rdbuf();
     return text.str();
 }
 

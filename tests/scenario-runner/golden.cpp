@@ -38,8 +38,7 @@ std::vector<std::vector<std::size_t>> common_lengths(const std::vector<std::stri
     std::vector<std::vector<std::size_t>> lengths(a.size() + 1, std::vector<std::size_t>(b.size() + 1, 0));
     for (std::size_t i = a.size(); i-- > 0;)
         for (std::size_t j = b.size(); j-- > 0;)
-            lengths[i][j] =
-                a[i] == b[j] ? lengths[i + 1][j + 1] + 1 : std::max(lengths[i + 1][j], lengths[i][j + 1]);
+            lengths[i][j] = a[i] == b[j] ? lengths[i + 1][j + 1] + 1 : std::max(lengths[i + 1][j], lengths[i][j + 1]);
     return lengths;
 }
 

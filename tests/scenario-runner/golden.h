@@ -12,7 +12,6 @@ namespace zel_scenario {
 int compare_with_golden(const PhoneState &state, const std::filesystem::path &folder);
 
 // The lines that only one side has, as "- line" and "+ line", in order. Equal lines are not shown.
-std::vector<std::string> line_difference(const std::vector<std::string> &before,
-                                         const std::vector<std::string> &after);
+std::vector<std::string> line_difference(const std::vector<std::string> &before, const std::vector<std::string> &after);
 
 } // namespace zel_scenario

@@ -20,7 +20,10 @@ constexpr const char *kData = "/opt/system/zel-default/data";
 
 // Folders whose files belong to the result of a run.
 constexpr const char *kListedFolders[] = {
-    "/opt/system/zel-default", "/opt/usr", "/csa", "/opt/dbspace",
+    "/opt/system/zel-default",
+    "/opt/usr",
+    "/csa",
+    "/opt/dbspace",
 };
 
 std::string content(const fs::path &path) {

@@ -12,7 +12,7 @@ namespace zel_scenario {
 using Json = nlohmann::ordered_json;
 
 class Phone {
-public:
+  public:
     explicit Phone(const Json &create_arguments);
     Phone(const Phone &) = delete;
     Phone &operator=(const Phone &) = delete;
@@ -25,7 +25,7 @@ public:
     // The workstation's path of a phone path, for looking from outside.
     [[nodiscard]] std::string outside(const std::string &phone_path) const { return root_ + phone_path; }
 
-private:
+  private:
     std::string root_;
     zel_host_phone *phone_ = nullptr;
 };

@@ -73,8 +73,8 @@ ScenarioRun::ScenarioRun(const Scenario &scenario) : scenario_{scenario}, phone_
 void ScenarioRun::do_step(const ScenarioStep &step) {
     if (step.word == "create") return;
     if (step.word == "package") {
-        const fs::path package = step.rest == "example" ? fs::path{ZEL_SOURCE_DIR} / "examples/package"
-                                                        : scenario_.folder / step.rest;
+        const fs::path package =
+            step.rest == "example" ? fs::path{ZEL_SOURCE_DIR} / "examples/package" : scenario_.folder / step.rest;
         phone_.call("package", {{"folder", package.string()}});
     } else if (step.word == "call") {
         const auto [verb, arguments] = split(step.rest);

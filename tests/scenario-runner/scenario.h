@@ -43,7 +43,7 @@ struct StepResult {
 
 // A phone as the scenario wants it, before any step that runs an entry point.
 class ScenarioRun {
-public:
+  public:
     explicit ScenarioRun(const Scenario &scenario);
 
     void do_step(const ScenarioStep &step);
@@ -54,7 +54,7 @@ public:
     [[nodiscard]] const std::string &output() const { return output_; }
     [[nodiscard]] bool ended_normally() const { return ended_normally_; }
 
-private:
+  private:
     const Scenario &scenario_;
     Phone phone_;
     std::string output_;

@@ -3,6 +3,7 @@
 #include "base/zel-svc-observer.h"
 #include "spec/zel-svc-spec-file.h"
 #include "spec/zel-svc-xml.h"
+#include "support/source-dir.h"
 
 #include "support/bench-phone.h"
 
@@ -14,7 +15,7 @@
 
 namespace {
 
-const std::string kPackage = ZEL_SOURCE_DIR "/examples/package/mps/ZEL";
+const std::string kPackage = zel_test::source_dir() + "/examples/package/mps/ZEL";
 
 std::string file_of_workstation(const std::string &path) {
     std::ifstream file{path, std::ios::binary};
