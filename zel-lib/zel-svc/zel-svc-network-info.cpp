@@ -44,7 +44,7 @@ bool insert(NetworkDatabase &database, std::int32_t id, const char *name, const 
     return database.run(kInsert, id, std::string_view{name}, std::string_view{mccmnc});
 }
 
-// A new row of the next id. `free` is the id that a failed look-up left.
+// A new row of the next id. `unused` is the id that the look-up left: it names no network.
 std::optional<std::int32_t> create(NetworkDatabase &database, std::int32_t unused, const char *name,
                                    const char *mccmnc) {
     NetworkStatement maximum = database.prepare(kMaximum);

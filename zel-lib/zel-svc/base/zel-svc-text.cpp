@@ -36,7 +36,7 @@ void zel_svc_text_copy(char *target, std::size_t size, std::string_view text) {
     if (size == 0) return;
     text = text.substr(0, std::min(text.find('\0'), text.size()));
     const std::size_t length = zel_svc_text_cut(text, size - 1);
-    // The text may be part of the target: a field cut into itself.
-    std::memmove(target, text.data(), length);
+    // The text may be part of the target: a field cut into itself. An empty one may have no address.
+    if (length != 0) std::memmove(target, text.data(), length);
     std::memset(target + length, 0, size - length);
 }
