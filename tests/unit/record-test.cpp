@@ -288,6 +288,14 @@ TEST_F(RecordShape, ItemsAreCounted) {
     EXPECT_EQ(group.number("bookmark", "count"), 2);
 }
 
+TEST_F(RecordShape, CountStopsAtTheLargestNumber) {
+    const LoadedGroup group{ZEL_SVC_DATA_BOOKMARK};
+    zel_svc_data_set_int(ZEL_SVC_DATA_BOOKMARK, "bookmark", "count", 2147483646);
+    EXPECT_EQ(zel_svc_record_count_up(ZEL_SVC_DATA_BOOKMARK, "bookmark"), 2147483647);
+    EXPECT_EQ(zel_svc_record_count_up(ZEL_SVC_DATA_BOOKMARK, "bookmark"), 2147483647);
+    EXPECT_EQ(group.number("bookmark", "count"), 2147483647);
+}
+
 TEST_F(RecordShape, EqualFieldsPass) {
     Item item;
     item.url.assign("u");

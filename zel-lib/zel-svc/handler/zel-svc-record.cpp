@@ -2,6 +2,7 @@
 
 #include "base/zel-svc-number.h"
 
+#include <limits>
 #include <string>
 
 namespace {
@@ -75,7 +76,8 @@ void zel_svc_field_load(ZelSvcDataGroup group, const char *section, const FieldR
 }
 
 int zel_svc_record_count_up(ZelSvcDataGroup group, const char *section) {
-    const int number = zel_svc_data_get_int(group, section, "count", 0) + 1;
+    const int held = zel_svc_data_get_int(group, section, "count", 0);
+    const int number = held < std::numeric_limits<int>::max() ? held + 1 : held;
     zel_svc_data_set_int(group, section, "count", number);
     return number;
 }
