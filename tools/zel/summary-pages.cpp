@@ -42,6 +42,16 @@ void print_settings(const Json &settings) {
     print_table({}, rows);
 }
 
+void print_records(const Json &records) {
+    std::vector<std::vector<std::string>> rows;
+    for (const Json &row : records)
+        rows.push_back({"  " + bytes_of(row, "name") + (row.value("sim", 1) == 2 ? ", SIM 2" : ""),
+                        or_dash(bytes_of(row, "value"))});
+    if (rows.empty()) return;
+    print_title("Recorded options (0: off, 1: on)");
+    print_table({}, rows);
+}
+
 // An operator has up to dozens of MCC+MNC with the same profiles: the page shows the first few, and the
 // profiles once.
 constexpr std::size_t kShownCodes = 6;
@@ -111,6 +121,7 @@ void print_summary(const Json &summary) {
     print_customer(summary["customer"]);
     print_auto_flags(summary["auto_flags"]);
     print_settings(summary["settings"]);
+    print_records(summary["records"]);
     print_networks(summary["sims"]);
     print_media(summary["media"]);
     print_section_store(summary["section_store"]);

@@ -14,6 +14,9 @@ Json summary_settings(const Phone &phone);
 // Null when the customer's file cannot be read.
 Json summary_auto_flags(const std::string &customer);
 
+// summary-records.cpp: options that the section store keeps, of both SIMs.
+Json summary_records();
+
 // summary-networks.cpp: one entry per network database that can be opened.
 Json summary_networks();
 

@@ -27,6 +27,10 @@ constexpr std::array kShownKeys = {
     ShownKey{"Touch sounds", "db/setting/sound/touch_sounds"},
     ShownKey{"Data roaming", "db/setting/data_roaming"},
     ShownKey{"GPS", "db/location/setting/GpsEnabled"},
+    ShownKey{"First day of the week (0: Sunday)", "db/private/com.quorvex.calendar-lite/first_day_of_week"},
+    ShownKey{"Bluetooth", "db/bluetooth/status"},
+    ShownKey{"SMS bearer (1: PS, 2: CS, 3: PS first)", "db/msg/network_mode"},
+    ShownKey{"Wide-band AMR codec", "db/zel/network/wb_amr_codec"},
     ShownKey{"Browser's user agent", "db/browser/user_agent"},
     ShownKey{"Power-on animation", "db/zel/power_ani_file_path"},
 };

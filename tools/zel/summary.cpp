@@ -10,6 +10,7 @@ int summary(Invocation &invocation) {
     Json answer{{"customer", summary_customer(phone)}};
     answer["auto_flags"] = summary_auto_flags(bytes_of(answer["customer"], "code"));
     answer["settings"] = summary_settings(phone);
+    answer["records"] = summary_records();
     answer["sims"] = summary_networks();
     answer["media"] = summary_media(phone);
     answer["section_store"] = summary_section_store(phone);
