@@ -21,7 +21,7 @@ foreach(flag IN ITEMS -fstack-protector-strong -fstack-clash-protection -fcf-pro
   endif()
 endforeach()
 target_compile_options(zel-hardening INTERFACE -U_FORTIFY_SOURCE -D_FORTIFY_SOURCE=2)
-target_link_options(zel-hardening INTERFACE -Wl,-z,relro -Wl,-z,noexecstack)
+target_link_options(zel-hardening INTERFACE -Wl,-z,relro -Wl,-z,now -Wl,-z,noexecstack)
 
 if(ZEL_SANITIZE)
   target_compile_options(zel-compile-options INTERFACE
@@ -35,5 +35,3 @@ else()
   endif()
 endif()
 target_link_options(zel-compile-options INTERFACE -Wl,--as-needed)
-# While parts of the library are still missing, programs link without them.
-target_link_options(zel-compile-options INTERFACE -fuse-ld=gold -Wl,--unresolved-symbols=ignore-all -Wl,-z,lazy)
