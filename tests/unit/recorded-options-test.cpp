@@ -125,6 +125,16 @@ TEST(RecordedOptions, EveryRowHasItsTests) {
     EXPECT_EQ(elements_of(zel_svc_active_sync_settings()), tested);
 }
 
+class EmailLimit : public BenchPhone {};
+
+TEST_F(EmailLimit, OtherSizesAreIgnored) {
+    const LoadedGroup group{ZEL_SVC_DATA_EMAIL};
+    for (const char *text : {"100", "0300", "300k", "30", "3000"}) {
+        install_spec("<EmailReceiving><RecLimit>" + std::string{text} + "</RecLimit></EmailReceiving>");
+        EXPECT_EQ(group.text("email", "recv_limit_size"), std::nullopt) << text;
+    }
+}
+
 class ActiveSyncRoaming : public BenchPhone {
   protected:
     static std::string roaming(const std::string &text) {

@@ -1,7 +1,6 @@
 #include "zel-svc-element-act-email-account.h"
 
-#include "handler/zel-svc-applies.h"
-#include "handler/zel-svc-record.h"
+#include "handler/zel-svc-recorded-items.h"
 
 namespace {
 
@@ -63,25 +62,11 @@ constexpr Field<EmailAccount> kFields[] = {
     field<&EmailAccount::pop_before_smtp>(ZEL_SVC_ELEMENT_POP_BEFORE_SMTP, switch_as("outgo_pop_before_smtp_%d")),
 };
 
-constexpr const char *kSection = "email_account";
-
-OpenRecord<EmailAccount> gAccount;
+RecordedItems<EmailAccount> gAccounts{ZEL_SVC_ELEMENT_ACCOUNT, ZEL_SVC_AUTO_EMAIL_ACCOUNT, ZEL_SVC_DATA_EMAIL_ACCOUNT,
+                                      "email_account", kFields};
 
 } // namespace
 
-void zel_svc_element_act_email_account_start(Occurrence &occurrence) {
-    if (occurrence.element == ZEL_SVC_ELEMENT_ACCOUNT && occurrence.installs()) gAccount.open();
-}
-
-void zel_svc_element_act_email_account_value(Occurrence &occurrence) {
-    if (occurrence.installs()) gAccount.copy(kFields, occurrence);
-}
-
-void zel_svc_element_act_email_account_end(Occurrence &occurrence) {
-    if (occurrence.element != ZEL_SVC_ELEMENT_ACCOUNT || !occurrence.installs()) return;
-    const auto account = gAccount.take();
-    if (!account) return;
-    if (!zel_svc_item_applies(occurrence, ZEL_SVC_AUTO_EMAIL_ACCOUNT, account->network_name.view())) return;
-    const int number = zel_svc_record_count_up(ZEL_SVC_DATA_EMAIL_ACCOUNT, kSection);
-    zel_svc_record_save<EmailAccount>(ZEL_SVC_DATA_EMAIL_ACCOUNT, kSection, kFields, *account, number);
-}
+void zel_svc_element_act_email_account_start(Occurrence &occurrence) { gAccounts.start(occurrence); }
+void zel_svc_element_act_email_account_value(Occurrence &occurrence) { gAccounts.value(occurrence); }
+void zel_svc_element_act_email_account_end(Occurrence &occurrence) { gAccounts.end(occurrence); }

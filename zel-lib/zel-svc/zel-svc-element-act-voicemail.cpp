@@ -1,7 +1,6 @@
 #include "zel-svc-element-act-voicemail.h"
 
-#include "handler/zel-svc-applies.h"
-#include "handler/zel-svc-record.h"
+#include "handler/zel-svc-recorded-items.h"
 
 namespace {
 
@@ -18,25 +17,11 @@ constexpr Field<Voicemail> kFields[] = {
     field<&Voicemail::number>(ZEL_SVC_ELEMENT_VOICEMAIL_TEL_NUM, {.record = {"tel_num_%d"}}),
 };
 
-constexpr const char *kSection = "voice_mail";
-
-OpenRecord<Voicemail> gVoicemail;
+RecordedItems<Voicemail> gVoicemails{ZEL_SVC_ELEMENT_VOICEMAIL, ZEL_SVC_AUTO_VOICEMAIL, ZEL_SVC_DATA_VOICE_MAIL,
+                                     "voice_mail", kFields};
 
 } // namespace
 
-void zel_svc_element_act_voicemail_start(Occurrence &occurrence) {
-    if (occurrence.element == ZEL_SVC_ELEMENT_VOICEMAIL && occurrence.installs()) gVoicemail.open();
-}
-
-void zel_svc_element_act_voicemail_value(Occurrence &occurrence) {
-    if (occurrence.installs()) gVoicemail.copy(kFields, occurrence);
-}
-
-void zel_svc_element_act_voicemail_end(Occurrence &occurrence) {
-    if (occurrence.element != ZEL_SVC_ELEMENT_VOICEMAIL || !occurrence.installs()) return;
-    const auto voicemail = gVoicemail.take();
-    if (!voicemail) return;
-    if (!zel_svc_item_applies(occurrence, ZEL_SVC_AUTO_VOICEMAIL, voicemail->network_name.view())) return;
-    const int number = zel_svc_record_count_up(ZEL_SVC_DATA_VOICE_MAIL, kSection);
-    zel_svc_record_save<Voicemail>(ZEL_SVC_DATA_VOICE_MAIL, kSection, kFields, *voicemail, number);
-}
+void zel_svc_element_act_voicemail_start(Occurrence &occurrence) { gVoicemails.start(occurrence); }
+void zel_svc_element_act_voicemail_value(Occurrence &occurrence) { gVoicemails.value(occurrence); }
+void zel_svc_element_act_voicemail_end(Occurrence &occurrence) { gVoicemails.end(occurrence); }
