@@ -80,6 +80,18 @@ TEST_F(ZelSummary, ListsGoByTheirEntriesNotByTheCount) {
     EXPECT_EQ(records_of("Voicemail 3").size(), 0U);
 }
 
+TEST_F(ZelSummary, DamagedFilesAreToldOfOnceAndEscaped) {
+    record("security", "[security\n\x1B[31mred\n");
+    record("email", "[email]\nrecv_poll_time = \"1h\"\n");
+    const Outcome outcome = run_zel({"summary"});
+    EXPECT_EQ(outcome.code, 0);
+    EXPECT_NE(outcome.out.find("E-mail poll time  1h"), std::string::npos) << outcome.out;
+    EXPECT_EQ(outcome.err.find('\x1B'), std::string::npos);
+    const std::size_t first = outcome.err.find("\\x1B[31mred");
+    EXPECT_NE(first, std::string::npos) << outcome.err;
+    EXPECT_EQ(outcome.err.find("\\x1B[31mred", first + 1), std::string::npos) << outcome.err;
+}
+
 TEST_F(ZelSummary, LocksAreShownOnceTheyWereAskedFor) {
     set_string("db/zel/salescode", "XFV");
     write("/opt/system/zel/mps/ZEL/Customer/XFV/customer.xml",

@@ -5,11 +5,29 @@
 #include "output.h"
 #include "root.h"
 
+#include <iniparser/iniparser.h>
+
+#include <array>
+#include <cstdarg>
+#include <cstdio>
 #include <exception>
 
 namespace {
 
 using namespace zel_command;
+
+// The INI library shows the lines that it cannot read as they stand, and they may hold any bytes.
+int report_ini_problem(const char *format, ...) {
+    std::array<char, 1200> text{};
+    va_list values;
+    va_start(values, format);
+    const int length = std::vsnprintf(text.data(), text.size(), format, values);
+    va_end(values);
+    std::string_view shown{text.data()};
+    if (shown.ends_with('\n')) shown.remove_suffix(1);
+    report_plain(shown);
+    return length;
+}
 
 int run(int argc, char **argv) {
     Invocation invocation;
@@ -45,6 +63,7 @@ int run_and_report(int argc, char **argv) {
 } // namespace
 
 int main(int argc, char **argv) {
+    iniparser_set_error_callback(report_ini_problem);
     const int code = run_and_report(argc, argv);
     if (flush_output()) return code;
     report("cannot write to standard output; the output is incomplete");

@@ -55,6 +55,8 @@ class OpenGroup {
         return std::string{zel_svc_data_get_text(group_, section, key.c_str())};
     }
 
+    [[nodiscard]] bool is(ZelSvcDataGroup group) const { return group_ == group; }
+
   private:
     ZelSvcDataGroup group_;
 };
@@ -80,22 +82,33 @@ void add_list(Json &result, const OpenGroup &group, const ShownRecord &shown, in
     }
 }
 
-void add_record(Json &result, const ShownRecord &shown, int sim, unsigned variant) {
-    const OpenGroup group{shown.group, variant};
+void add_record(Json &result, const OpenGroup &group, const ShownRecord &shown, int sim) {
     if (shown.key.find("%d") != std::string_view::npos) return add_list(result, group, shown, sim);
     const std::string key{shown.key};
     if (const auto value = group.text(shown.section, key)) add_row(result, shown, sim, shown.name, key, *value);
+}
+
+bool is_shared(ZelSvcDataGroup group) { return path_of(group, ZEL_SVC_DATA_SIM2) == path_of(group, ZEL_SVC_DATA_SIM1); }
+
+// Rows of one group stand together, so that each file is read once.
+void add_records(Json &result, int sim, unsigned variant) {
+    std::optional<OpenGroup> open;
+    for (const ShownRecord &shown : kShownRecords) {
+        if (variant == ZEL_SVC_DATA_SIM2 && is_shared(shown.group)) continue;
+        if (!open || !open->is(shown.group)) {
+            open.reset();
+            open.emplace(shown.group, variant);
+        }
+        add_record(result, *open, shown, sim);
+    }
 }
 
 } // namespace
 
 Json summary_records() {
     Json result = Json::array();
-    for (const ShownRecord &shown : kShownRecords)
-        add_record(result, shown, 1, ZEL_SVC_DATA_SIM1);
-    for (const ShownRecord &shown : kShownRecords)
-        if (path_of(shown.group, ZEL_SVC_DATA_SIM2) != path_of(shown.group, ZEL_SVC_DATA_SIM1))
-            add_record(result, shown, 2, ZEL_SVC_DATA_SIM2);
+    add_records(result, 1, ZEL_SVC_DATA_SIM1);
+    add_records(result, 2, ZEL_SVC_DATA_SIM2);
     return result;
 }
 
