@@ -220,6 +220,8 @@ const StoredString kStoredStrings[] = {
     {"Apostrophe", "it's", "it's"},
     {"OnlyASingleQuote", "'", "'"},
     {"OnlyADoubleQuote", "\"", "\""},
+    {"TwoSingleQuotes", "''", "''"},
+    {"TwoDoubleQuotes", "\"\"", "\"\""},
     {"DoubleQuotesInside", "say \"yes\"", "say \"yes\""},
     {"DoubleQuotesAround", "\"all\"", "\"all\""},
     {"SingleQuotesAround", "'all'", "'all'"},
