@@ -1,6 +1,7 @@
 #include "phone-state.h"
 
 #include <sqlite3.h>
+#include <unistd.h>
 
 #include <algorithm>
 #include <filesystem>
@@ -67,8 +68,16 @@ std::vector<std::string> media_status(Phone &phone, const std::string &path) {
     return lines_of(std::regex_replace(content(phone.outside(path)), size, "$1N"));
 }
 
+// A file that no run gave to anyone belongs to who made the phone: the same owner in a golden file, whether the
+// tests run as root or as a user.
+void mask_own(Json &stat, const char *field, unsigned own) {
+    if (stat.contains(field) && stat[field] == own) stat[field] = 0;
+}
+
 std::string described(Phone &phone, const std::string &path) {
-    const Json stat = phone.call("stat", {{"path", path}});
+    Json stat = phone.call("stat", {{"path", path}});
+    mask_own(stat, "owner", geteuid());
+    mask_own(stat, "group", getegid());
     std::string line = path;
     for (const char *field : {"kind", "mode", "owner", "group", "label"})
         if (stat.contains(field) && !stat[field].is_null()) line += std::string{" "} + field + "=" + shown(stat[field]);
