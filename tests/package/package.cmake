@@ -5,4 +5,5 @@ add_test(NAME package.ExampleIsReadableAndUsesEveryElement
          COMMAND Python3::Interpreter ${PROJECT_SOURCE_DIR}/scripts/check-example)
 foreach(topic checker guide generators remake)
   add_test(NAME package.${topic} COMMAND Python3::Interpreter -B ${CMAKE_CURRENT_LIST_DIR}/test_${topic}.py)
+  set_tests_properties(package.${topic} PROPERTIES COST 50 TIMEOUT 300) # long ones first: the short ones fill the gaps
 endforeach()
