@@ -17,7 +17,7 @@ namespace {
 using namespace zel_command;
 
 // The INI library shows the lines that it cannot read as they stand, and they may hold any bytes.
-int report_ini_problem(const char *format, ...) {
+__attribute__((format(printf, 1, 2))) int report_ini_problem(const char *format, ...) {
     std::array<char, 1200> text{};
     va_list values;
     va_start(values, format);
