@@ -10,9 +10,10 @@ namespace {
 
 constexpr int kBusyWaitMs = 10000;
 
+// Never destroyed: the process's own phone closes its store when the program's statics end, after this list would have.
 std::vector<Store *> &stores() {
-    static std::vector<Store *> all;
-    return all;
+    static auto *const all = new std::vector<Store *>;
+    return *all;
 }
 
 void close_before_fork() {
