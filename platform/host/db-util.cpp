@@ -40,5 +40,7 @@ ZEL_HOST_EXPORT int db_util_open(const char *path, sqlite3 **database, int optio
 }
 
 ZEL_HOST_EXPORT int db_util_close(sqlite3 *database) {
-    return answer<function("db_util_close")>([&](Phone &) { return sqlite3_close(database); });
+    // Closed also when the call is told to fail: its caller has no second way to give the connection back.
+    const int result = sqlite3_close(database);
+    return answer<function("db_util_close")>([&](Phone &) { return result; });
 }
