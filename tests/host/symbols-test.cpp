@@ -21,7 +21,7 @@ std::string text_of(const std::string &file) {
 
 // Names of functions in a header: a name before "(" at the start of a declaration.
 void add_declared(const std::string &file, std::set<std::string> &names) {
-    static const std::regex kDeclaration(R"(^[a-z][A-Za-z0-9_ ]*[ *]([a-z_][a-z0-9_]*)\()", std::regex::multiline);
+    static const std::regex kDeclaration(R"(^[a-z][A-Za-z0-9_ ]*[ *]+([a-z_][a-z0-9_]*)\()", std::regex::multiline);
     const std::string text = text_of(file);
     for (std::sregex_iterator at(text.begin(), text.end(), kDeclaration), end; at != end; ++at)
         names.insert((*at)[1]);
@@ -43,10 +43,10 @@ std::set<std::string> exported() {
 TEST(Symbols, AreTheDeclaredFunctions) {
     std::set<std::string> declared;
     for (const char *header :
-         {"db-util", "device-power", "dlog", "security-server", "smack", "theme", "vconf", "zel-platform"})
+         {"db-util", "device-power", "dlog", "security-server", "smack", "telephony", "theme", "vconf", "zel-platform"})
         add_declared(std::string("/platform/include/") + header + ".h", declared);
     add_declared("/platform/host/zel-host.h", declared);
-    EXPECT_GE(declared.size(), 28U);
+    EXPECT_GE(declared.size(), 32U);
     EXPECT_EQ(exported(), declared);
 }
 
