@@ -3,6 +3,7 @@
 #include "content.h"
 #include "folder.h"
 #include "layout.h"
+#include "modem.h"
 #include "open-file.h"
 #include "record.h"
 #include "verb.h"

@@ -41,8 +41,8 @@ inline constexpr Function kFunctions[] = {
     {.name = "uxt_theme_set_suitable_system_color_info_from_image", .text = 0},
     {.name = "tel_get_cp_name_list", .failing = Failing::NullPointer},
     {.name = "tel_init", .failing = Failing::NullPointer, .text = 0},
-    {.name = "tel_get_sim_imsi"},
-    {.name = "tel_deinit"},
+    {.name = "tel_get_sim_imsi", .text = 0}, // the modem's name
+    {.name = "tel_deinit", .text = 0},
     {.name = "zel_platform_open", .text = 0},
     {.name = "zel_platform_open_parent", .text = 0},
     {.name = "zel_platform_set_owner"},

@@ -1,7 +1,6 @@
 #include "layout.h"
 
-#include "keys.h"
-#include "record.h"
+#include "modem.h"
 #include "tools.h"
 
 #include <fcntl.h>
@@ -22,6 +21,8 @@ CREATE TABLE fault (id INTEGER PRIMARY KEY AUTOINCREMENT, function TEXT NOT NULL
 CREATE TABLE journal (id INTEGER PRIMARY KEY, function TEXT NOT NULL, arguments TEXT NOT NULL);
 CREATE TABLE tool (path TEXT PRIMARY KEY, status INTEGER NOT NULL, file TEXT NOT NULL,
                    content TEXT NOT NULL) WITHOUT ROWID;
+CREATE TABLE modem (slot INTEGER PRIMARY KEY, name TEXT NOT NULL, state INTEGER NOT NULL, mcc TEXT, mnc TEXT,
+                    msin TEXT, gid TEXT, spn TEXT, result INTEGER);
 )";
 
 // The telephony side reads pdp_profile by position: columns 24 and 25 follow one that only it writes.
@@ -104,6 +105,7 @@ void make_network_database(Phone &phone, const char *path) {
 void make_state(Phone &phone) {
     Transaction transaction(phone.store());
     phone.store().execute(kStateTables);
+    make_modems(phone);
     transaction.commit();
 }
 
@@ -114,14 +116,6 @@ void make_platform(Phone &phone) {
         make_network_database(phone, path);
     for (const PlatformTool &tool : kTools)
         add_tool(phone, {.path = tool.path, .exit_status = 0, .file = tool.file, .content = {}});
-}
-
-void announce_slots(Phone &phone) {
-    const std::int64_t slots = recorded_number(phone, "slots", 1);
-    set_key(phone, "memory/telephony/sim_slot_count", KeyType::Integer, slots);
-    set_key(phone, "memory/telephony/sim_slot", KeyType::Integer, recorded_number(phone, "sim_state_1"));
-    if (slots > 1)
-        set_key(phone, "memory/telephony/sim_slot2", KeyType::Integer, recorded_number(phone, "sim_state_2"));
 }
 
 } // namespace zel_host

@@ -9,7 +9,5 @@ namespace zel_host {
 void make_state(Phone &phone);
 // The platform's folders and network databases; throws StoreError.
 void make_platform(Phone &phone);
-// The slot count and SIM states that the platform sets when the phone starts.
-void announce_slots(Phone &phone);
 
 } // namespace zel_host

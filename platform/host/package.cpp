@@ -4,6 +4,7 @@
 #include "content.h"
 #include "fault.h"
 #include "layout.h"
+#include "modem.h"
 #include "open-file.h"
 #include "system-log.h"
 #include "verb.h"
@@ -55,7 +56,7 @@ bool take_away(Phone &phone) {
 
 void forget(Phone &phone) {
     phone.store().execute("DELETE FROM vconf; DELETE FROM attribute; DELETE FROM journal; DELETE FROM tool;"
-                          "DELETE FROM record WHERE name <> 'slots' AND name NOT LIKE 'sim_state_%'");
+                          "DELETE FROM record WHERE name <> 'slots'");
     clear_faults(phone);
     clear_log(phone);
     run_clock(phone);

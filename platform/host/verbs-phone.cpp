@@ -1,7 +1,7 @@
 #include "create.h"
 #include "fault.h"
 #include "keys.h"
-#include "layout.h"
+#include "modem.h"
 #include "package.h"
 #include "phone-lock.h"
 #include "record.h"
@@ -11,7 +11,6 @@
 namespace zel_host {
 namespace {
 
-constexpr std::int64_t kMostSlots = 2;
 constexpr const char *kForgotten[] = {"display_lock_1", "toolkit_users", "restart_command"};
 
 Json shown(const Copied &copied) {
@@ -20,7 +19,7 @@ Json shown(const Copied &copied) {
 
 Json create(const Json &arguments) {
     const std::int64_t slots = number_of(arguments, "sims", 1);
-    if (slots < 0 || slots > kMostSlots) throw WrongArguments("a phone has 0 to 2 SIM slots");
+    if (slots < 0 || slots > kMostModems) throw WrongArguments("a phone has 0 to 2 SIM slots");
     NewPhone wanted{.root = text_of(arguments, "root"), .slots = static_cast<int>(slots), .product_code = {}};
     if (arguments.contains("product-code")) wanted.product_code = text_of(arguments, "product-code");
     const std::unique_ptr<Phone> phone = create_phone(wanted);
@@ -36,8 +35,7 @@ Json package(Phone &phone, const Json &arguments) {
 }
 
 Json status(Phone &phone, const Json & /*arguments*/) {
-    const std::int64_t slots = recorded_number(phone, "slots", 1);
-    Json result{{"slots", slots},
+    Json result{{"slots", slot_count(phone)},
                 {"sim_states", Json::array()},
                 {"display_locked", recorded_number(phone, "display_lock_1") != 0},
                 {"toolkit_users", recorded_number(phone, "toolkit_users")},
@@ -49,8 +47,8 @@ Json status(Phone &phone, const Json & /*arguments*/) {
                 {"journal", phone.page().journal_on.load() != 0}};
     put_text(result, "root", phone.path());
     put_text(result, "theme_picture", recorded_text(phone, "theme_picture"));
-    for (std::int64_t slot = 1; slot <= slots; ++slot)
-        result["sim_states"].push_back(recorded_number(phone, "sim_state_" + std::to_string(slot)));
+    for (const Modem &modem : modems(phone))
+        result["sim_states"].push_back(modem.state);
     return result;
 }
 
@@ -76,14 +74,6 @@ Json lock(Phone &phone, const Json &arguments) {
     return Json::object();
 }
 
-Json sim(Phone &phone, const Json &arguments) {
-    const std::int64_t slot = number_of(arguments, "slot");
-    if (slot < 1 || slot > kMostSlots) throw WrongArguments("a slot is 1 or 2");
-    if (arguments.contains("state")) record(phone, "sim_state_" + std::to_string(slot), number_of(arguments, "state"));
-    announce_slots(phone);
-    return {{"slot", slot}, {"state", recorded_number(phone, "sim_state_" + std::to_string(slot))}};
-}
-
 constexpr Argument kCreateArguments[] = {
     {.name = "root", .required = true, .help = "The folder, empty or not there yet"},
     {.name = "package", .help = "Folder of a customisation package to put on the phone"},
@@ -93,10 +83,6 @@ constexpr Argument kCreateArguments[] = {
 constexpr Argument kPackageArguments[] = {{.name = "folder", .required = true, .help = "Folder of the package"}};
 constexpr Argument kLockArguments[] = {
     {.name = "holder", .required = true, .help = "Who takes the lock, as others are told"}};
-constexpr Argument kSimArguments[] = {
-    {.name = "slot", .type = ArgumentType::Integer, .required = true, .help = "The slot: 1 or 2"},
-    {.name = "state", .type = ArgumentType::Integer, .help = "Its new state: 0 absent, 1 inserted"},
-};
 
 constexpr Verb kVerbs[] = {
     {.name = "create", .help = "Make a phone", .arguments = kCreateArguments, .run_without_phone = create},
@@ -105,7 +91,6 @@ constexpr Verb kVerbs[] = {
     {.name = "reboot", .help = "Restart: \"memory/\" keys vanish, the slots are announced", .run = restart},
     {.name = "reset", .help = "Make the phone as new; package, product code, slots stay", .run = reset},
     {.name = "lock", .help = "Hold the phone for this program alone", .arguments = kLockArguments, .run = lock},
-    {.name = "sim", .help = "Show or change the state of a SIM slot", .arguments = kSimArguments, .run = sim},
 };
 
 } // namespace
