@@ -50,11 +50,9 @@ std::string events(const ZelSvcElement &row) {
     return std::string(row.start ? "s" : "") + (row.value ? "v" : "") + (row.end ? "e" : "");
 }
 
-// Maximum PDP contexts, fast dormancy, and everything from the browser to data sync: rows of these groups
+// Everything from the browser to data sync: rows of these groups
 // have their handlers or none.
-bool may_have_none(std::size_t row) {
-    return (row >= 47 && row <= 51) || (row >= 56 && row <= 62) || (row >= 204 && row <= 278);
-}
+bool may_have_none(std::size_t row) { return row >= 204 && row <= 278; }
 
 } // namespace
 

@@ -31,3 +31,12 @@ template <class Function> void zel_svc_for_each_network(std::string_view network
     for (const ZelSvcNetworkEntry &entry : zel_svc_network_table())
         if (zel_svc_is_every_network(network_name) || network_name == entry.network_name) f(entry);
 }
+
+// The same until a call of f(entry) gives false; whether none did.
+template <class Function> bool zel_svc_every_network(std::string_view network_name, Function &&f) {
+    for (const ZelSvcNetworkEntry &entry : zel_svc_network_table()) {
+        if (!zel_svc_is_every_network(network_name) && network_name != entry.network_name) continue;
+        if (!f(entry)) return false;
+    }
+    return true;
+}

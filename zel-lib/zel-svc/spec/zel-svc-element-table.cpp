@@ -5,11 +5,13 @@
 #include "zel-svc-element-act-contact.h"
 #include "zel-svc-element-act-email-account.h"
 #include "zel-svc-element-act-email.h"
+#include "zel-svc-element-act-fast-dormancy.h"
 #include "zel-svc-element-act-general-info.h"
 #include "zel-svc-element-act-gps.h"
 #include "zel-svc-element-act-header.h"
 #include "zel-svc-element-act-ims.h"
 #include "zel-svc-element-act-main.h"
+#include "zel-svc-element-act-max-pdp.h"
 #include "zel-svc-element-act-message.h"
 #include "zel-svc-element-act-multimedia.h"
 #include "zel-svc-element-act-network-info.h"
@@ -88,24 +90,24 @@ extern constexpr std::array<ZelSvcElement, ZEL_SVC_ELEMENT_COUNT> kZelSvcElement
     {ZEL_SVC_ELEMENT_AUTO_ATTACH,                     "AutoAttach",                      "",                  kNone, zel_svc_element_act_network_value, kNone, kOnce, 1},
     {ZEL_SVC_ELEMENT_AUTO_DETACH,                     "AutoDetach",                      "",                  kNone, zel_svc_element_act_network_value, kNone, kOnce, 1},
     // maximum PDP contexts
-    {ZEL_SVC_ELEMENT_NB_MAX_PDP,                      "NbMaxPDP",                        "",                  kNone, kNone, kNone, kOnce, 1},
-    {ZEL_SVC_ELEMENT_MAX_PDP,                         "MaxPDP",                          "",                  kNone, kNone, kNone, kRepeats, 1},
-    {ZEL_SVC_ELEMENT_MAX_PDP_NETWORK_NAME,            "NetworkName",                     "MaxPDP",            kNone, kNone, kNone, kRepeats, 1},
-    {ZEL_SVC_ELEMENT_MAX_PDP_2G,                      "MaxPDP2G",                        "",                  kNone, kNone, kNone, kRepeats, 1},
-    {ZEL_SVC_ELEMENT_MAX_PDP_3G,                      "MaxPDP3G",                        "",                  kNone, kNone, kNone, kRepeats, 1},
+    {ZEL_SVC_ELEMENT_NB_MAX_PDP,                      "NbMaxPDP",                        "",                  kNone, zel_svc_element_act_max_pdp_value, kNone, kOnce, 1},
+    {ZEL_SVC_ELEMENT_MAX_PDP,                         "MaxPDP",                          "",                  zel_svc_element_act_max_pdp_start, kNone, zel_svc_element_act_max_pdp_end, kRepeats, 1},
+    {ZEL_SVC_ELEMENT_MAX_PDP_NETWORK_NAME,            "NetworkName",                     "MaxPDP",            kNone, zel_svc_element_act_max_pdp_value, kNone, kRepeats, 1},
+    {ZEL_SVC_ELEMENT_MAX_PDP_2G,                      "MaxPDP2G",                        "",                  kNone, zel_svc_element_act_max_pdp_value, kNone, kRepeats, 1},
+    {ZEL_SVC_ELEMENT_MAX_PDP_3G,                      "MaxPDP3G",                        "",                  kNone, zel_svc_element_act_max_pdp_value, kNone, kRepeats, 1},
     // wide-band AMR
     {ZEL_SVC_ELEMENT_NB_WB_AMR,                       "NbWbAmr",                         "",                  kNone, zel_svc_element_act_wb_amr_value, kNone, kOnce, 1},
     {ZEL_SVC_ELEMENT_WB_AMR,                          "WbAmr",                           "",                  zel_svc_element_act_wb_amr_start, kNone, zel_svc_element_act_wb_amr_end, kRepeats, 1},
     {ZEL_SVC_ELEMENT_WB_AMR_NETWORK_NAME,             "NetworkName",                     "WbAmr",             kNone, zel_svc_element_act_wb_amr_value, kNone, kRepeats, 1},
     {ZEL_SVC_ELEMENT_WB_AMR_CODEC,                    "WbAmrCodec",                      "",                  kNone, zel_svc_element_act_wb_amr_value, kNone, kRepeats, 1},
     // fast dormancy
-    {ZEL_SVC_ELEMENT_NB_FAST_DORMANCY,                "NbFastDormancy",                  "",                  kNone, kNone, kNone, kOnce, 1},
-    {ZEL_SVC_ELEMENT_FAST_DORMANCY,                   "FastDormancy",                    "",                  kNone, kNone, kNone, kRepeats, 1},
-    {ZEL_SVC_ELEMENT_FAST_DORMANCY_NETWORK_NAME,      "NetworkName",                     "FastDormancy",      kNone, kNone, kNone, kRepeats, 1},
-    {ZEL_SVC_ELEMENT_FAST_DORMANCY_ENABLE_STATUS,     "FastDormancyEnableStatus",        "",                  kNone, kNone, kNone, kRepeats, 1},
-    {ZEL_SVC_ELEMENT_TIMEOUT_VALUE,                   "TimeoutValue",                    "",                  kNone, kNone, kNone, kRepeats, 1},
-    {ZEL_SVC_ELEMENT_LCD_STATUS,                      "LCDStatus",                       "",                  kNone, kNone, kNone, kRepeats, 1},
-    {ZEL_SVC_ELEMENT_FAST_DORMANCY_VERSION,           "Version",                         "FastDormancy",      kNone, kNone, kNone, kRepeats, 1},
+    {ZEL_SVC_ELEMENT_NB_FAST_DORMANCY,                "NbFastDormancy",                  "",                  kNone, zel_svc_element_act_fast_dormancy_value, kNone, kOnce, 1},
+    {ZEL_SVC_ELEMENT_FAST_DORMANCY,                   "FastDormancy",                    "",                  zel_svc_element_act_fast_dormancy_start, kNone, zel_svc_element_act_fast_dormancy_end, kRepeats, 1},
+    {ZEL_SVC_ELEMENT_FAST_DORMANCY_NETWORK_NAME,      "NetworkName",                     "FastDormancy",      kNone, zel_svc_element_act_fast_dormancy_value, kNone, kRepeats, 1},
+    {ZEL_SVC_ELEMENT_FAST_DORMANCY_ENABLE_STATUS,     "FastDormancyEnableStatus",        "",                  kNone, zel_svc_element_act_fast_dormancy_value, kNone, kRepeats, 1},
+    {ZEL_SVC_ELEMENT_TIMEOUT_VALUE,                   "TimeoutValue",                    "",                  kNone, zel_svc_element_act_fast_dormancy_value, kNone, kRepeats, 1},
+    {ZEL_SVC_ELEMENT_LCD_STATUS,                      "LCDStatus",                       "",                  kNone, zel_svc_element_act_fast_dormancy_value, kNone, kRepeats, 1},
+    {ZEL_SVC_ELEMENT_FAST_DORMANCY_VERSION,           "Version",                         "FastDormancy",      kNone, zel_svc_element_act_fast_dormancy_value, kNone, kRepeats, 1},
     // display, sound, phone
     {ZEL_SVC_ELEMENT_DISPLAY,                         "Display",                         "",                  kNone, kNone, kNone, kOnce, 1},
     {ZEL_SVC_ELEMENT_WALLPAPER,                       "Wallpaper",                       "",                  zel_svc_element_act_main_media_start, kNone, kNone, kRepeats, 1},
