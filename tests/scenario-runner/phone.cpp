@@ -1,6 +1,7 @@
 #include "phone.h"
 
-#include <cstdlib>
+#include "support/temporary-folder.h"
+
 #include <filesystem>
 #include <stdexcept>
 
@@ -20,9 +21,7 @@ Json called(zel_host_phone *phone, const std::string &verb, const Json &argument
 } // namespace
 
 Phone::Phone(const Json &create_arguments) {
-    char name[] = "/tmp/zel.XXXXXX";
-    if (!mkdtemp(name)) throw std::runtime_error("no temporary folder");
-    root_ = name;
+    root_ = zel_test::make_temporary_folder();
     Json arguments = create_arguments;
     arguments["root"] = root_;
     called(nullptr, "create", arguments);

@@ -1,5 +1,7 @@
 #include "support/bench-phone.h"
 
+#include "support/temporary-folder.h"
+
 #include <cstdlib>
 #include <filesystem>
 #include <fstream>
@@ -23,11 +25,7 @@ json taken(char *answer) {
 
 } // namespace
 
-std::string make_folder() {
-    std::string name = "/tmp/zelXXXXXX"; // short: socket paths below it must fit 108 bytes
-    if (::mkdtemp(name.data()) == nullptr) throw std::runtime_error("cannot make a temporary folder");
-    return name;
-}
+std::string make_folder() { return make_temporary_folder(); }
 
 void remove_folder(const std::string &folder) {
     std::error_code ignored;
