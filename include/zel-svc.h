@@ -85,13 +85,24 @@ typedef struct {
     int32_t passed; /* 1 or 0 */
 } ZelSvcVerificationResult;
 
-/* Identity of an inserted SIM. */
+/* Identity of an inserted SIM: its IMSI in two parts (3GPP TS 23.003, clause 2.2), and what tells an operator
+ * from another one of the same network (EF GID1 and EF SPN, 3GPP TS 31.102). The MSIN identifies a subscriber:
+ * no log of this library shows more than its first three digits, and no caller's should. */
 typedef struct {
     char mccmnc[10];
     char msin[20];
-    char gid[10]; /* never read from the card: empty */
-    char spn[15]; /* never read from the card: empty */
+    char gid[10]; /* group identifier; never read from the card: empty */
+    char spn[15]; /* service provider name; never read from the card: empty */
 } ZelSvcSimInfo;
+
+/* What a run of SIM auto setting came to. */
+typedef enum {
+    ZEL_SVC_SIM_INSTALLED = 0,         /* an operator was installed for at least one slot */
+    ZEL_SVC_SIM_SELECTION_NEEDED = 1,  /* the user has to choose for at least one slot, whatever the other did */
+    ZEL_SVC_SIM_NOTHING_INSTALLED = 2, /* no SIM, the same one as last time, an unreadable one, or no operator */
+    ZEL_SVC_SIM_NO_CUSTOMER = 3,       /* the phone has no active customer */
+    ZEL_SVC_SIM_DISABLED = 4           /* the customer's file leaves nothing to the SIM */
+} ZelSvcSimResult;
 
 /* One operator of a customer: the customer whose file is installed and the network it is installed for. */
 typedef struct {
@@ -222,9 +233,79 @@ ZEL_SVC_API int zel_svc_config_chk_approval_version_exist(void);
 ZEL_SVC_API int zel_svc_config_get_security_lock_info(ZelSvcSecurityLock *result);
 
 /*
- * SIM auto setting: the operator that the inserted SIM card decided on, kept for each SIM slot in string keys
- * below "db/private/zel". Slot 2 is the second SIM's; any other number is the first's. The customer's name
- * is one for both slots.
+ * SIM auto setting: on phones whose SIM card decides the operator, the platform calls
+ * zel_svc_sim_auto_setting_execute_by_sim() after each start.
+ *
+ * A slot is 1 or 2. Slot 2 is the second SIM's; any other number is the first's.
+ */
+
+/*
+ * Looks at each SIM slot and, where the SIM is another one than last time, finds the operator of the active
+ * customer that it belongs to and installs it: a ZelSvcSimResult.
+ *
+ * One match is installed, set active, and the SIM's identity kept, so that the same SIM is not looked at again;
+ * without a match the identity alone is kept. With several nothing is installed and
+ * "db/private/zel/sim_selection_show" (slot 2: "db/private/zel/sim2/sim_selection_show") becomes 1: the caller
+ * lets the user choose among zel_svc_sim_auto_setting_get_operator_list_by_sim() and then, itself,
+ *
+ *  1. calls zel_svc_sim_auto_setting_install_operator() and zel_svc_sim_auto_setting_set_active_operator(),
+ *  2. stores the SIM's identity in "db/private/zel/sim_mcc_mnc" and "db/private/zel/sim_msin" (slot 2:
+ *     "db/private/zel/sim2/..."), or the next run asks again, and
+ *  3. sets the selection key to 0.
+ *
+ * "memory/private/zel/sim_changed" (bool; slot 2: "memory/private/zel/sim2/sim_changed") becomes 1 when a SIM
+ * has changed; only zel_svc_sim_auto_setting_clear_active_operator() resets it.
+ *
+ * What was found and decided stands in "/opt/system/zel-default/output/zel-sim-check.log" and, from the
+ * discovery of another SIM on, in "zel-sim-setting.log" beside it (slot 2: "zel-sim2-...").
+ */
+ZEL_SVC_API int zel_svc_sim_auto_setting_execute_by_sim(void);
+
+/* Whether the SIM decides the operator: 0 no (the active customer's file leaves nothing to the SIM, or there is
+ * no active customer), 1 yes, 2 yes and a choice of the user is awaited for a slot. */
+ZEL_SVC_API int zel_svc_sim_auto_setting_chk_feature_enable(void);
+
+/* Reads the SIM of a slot. 0, and an empty record, when its IMSI cannot be read. GID and SPN stay empty. */
+ZEL_SVC_API int zel_svc_sim_auto_setting_get_sim_info(ZelSvcSimInfo *info, int slot);
+
+/*
+ * Fills `list`, which must hold ZEL_SVC_MAX_OPERATORS entries, with the networks that the active customer's
+ * file states, or with `all_customers` not 0 with those of every customer of the package, and sets `count`.
+ * Entries beyond ZEL_SVC_MAX_OPERATORS are left out. The files are parsed anew, so this does not belong into
+ * the middle of an install.
+ */
+ZEL_SVC_API void zel_svc_sim_auto_setting_get_operator_list(ZelSvcSimOperator *list, int32_t *count, int all_customers);
+
+/*
+ * Fills `list`, which must hold ZEL_SVC_MAX_OPERATORS entries, with the active customer's operators that a SIM
+ * may belong to, in the file's order, and sets `count`. The MCC and MNC must be the SIM's. Then an entry's
+ * subset code (the first digits of the MSIN), or else its GID, or else its SP name (compared without regard to
+ * the case of ASCII letters) decides: the first entry whose own is the SIM's is the only one listed. Without
+ * such an entry, those that ask for none of the three are listed. Since GID and SPN are not read from the card,
+ * entries that ask for them match only a record that the caller filled.
+ */
+ZEL_SVC_API void zel_svc_sim_auto_setting_get_operator_list_by_sim(const ZelSvcSimInfo *info, ZelSvcSimOperator *list,
+                                                                   int32_t *count);
+
+/*
+ * Installs an operator for a slot: of the groups whose Auto flag the active customer's file sets (APN profiles,
+ * bookmarks, voicemail, e-mail accounts, WB-AMR, fast dormancy, maximum PDP contexts), and of the IMS settings
+ * in any case, the entries that `customer_name`'s file holds for `network_name`. Only these two fields decide;
+ * the others are told in the setting log. The telephony daemon is told that its APN profiles are new, and its
+ * answer awaited for the bus library's time-out (25 seconds) at most.
+ *
+ * Bookmarks, e-mail accounts and WB-AMR codecs are one for both slots: the later install wins. At the end
+ * "memory/zel/sim_auto_setting_updated" becomes 1; nothing in this library resets it. The operator is not
+ * recorded as active: see below. Nothing is reported; failures are in the system log.
+ */
+ZEL_SVC_API void zel_svc_sim_auto_setting_install_operator(const ZelSvcSimOperator *operator_entry, int slot);
+
+/* Does nothing, and returns its argument: kept for callers that link it. */
+ZEL_SVC_API int zel_svc_reinstall_connection(int value);
+
+/*
+ * The active operator: the one that the inserted SIM card decided on, kept for each SIM slot in string keys
+ * below "db/private/zel". The customer's name is one for both slots.
  */
 
 /*

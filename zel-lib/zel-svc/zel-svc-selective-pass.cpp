@@ -65,13 +65,6 @@ constexpr bool every_pass_fits_the_enabled_list() {
 }
 static_assert(every_pass_fits_the_enabled_list(), "an element beyond the list would silently stay disabled");
 
-void enable_only(std::span<const ZelSvcElementRange> ranges) {
-    zel_svc_element_clear_enabled();
-    for (const ZelSvcElementRange &range : ranges)
-        for (int id = range.first; id <= range.last; ++id)
-            zel_svc_element_enable(static_cast<ZelSvcElementId>(id));
-}
-
 bool flag_allows(ZelSvcAutoFlag flag, int wanted) {
     return flag == ZEL_SVC_AUTO_NEVER || gbZelSvcNetworkAutoFlags[static_cast<std::size_t>(flag)] == wanted;
 }
@@ -80,10 +73,17 @@ bool flag_allows(ZelSvcAutoFlag flag, int wanted) {
 
 const ZelSvcSelectivePass &zel_svc_selective_pass(ZelSvcPass pass) { return kPasses[static_cast<std::size_t>(pass)]; }
 
-void zel_svc_selective_parse(std::span<const ZelSvcElementRange> elements, ZelSvcParseMode mode, const char *path) {
-    enable_only(elements);
+void zel_svc_selective_enable(std::span<const ZelSvcElementRange> elements) {
+    zel_svc_element_clear_enabled();
+    for (const ZelSvcElementRange &range : elements)
+        for (int id = range.first; id <= range.last; ++id)
+            zel_svc_element_enable(static_cast<ZelSvcElementId>(id));
+}
+
+bool zel_svc_selective_parse(std::span<const ZelSvcElementRange> elements, ZelSvcParseMode mode, const char *path) {
+    zel_svc_selective_enable(elements);
     geZelSvcParseMode = mode;
-    zel_svc_spec_parse_file(ZEL_SVC_PARSE_ACTION_INSTALL, path, 0);
+    return zel_svc_spec_parse_file(ZEL_SVC_PARSE_ACTION_INSTALL, path, 0) == 1;
 }
 
 void zel_svc_selective_pass_run(ZelSvcPass id, const ZelSvcPassSequence &sequence, int lap) {
@@ -102,6 +102,7 @@ void zel_svc_selective_pass_run(ZelSvcPass id, const ZelSvcPassSequence &sequenc
     __zel_svc_config_time_lap_end(lap);
 }
 
-void zel_svc_selective_pass_read_auto_flags(const std::string &path) {
-    zel_svc_guarded([&] { zel_svc_selective_parse(kAutoFlags, ZEL_SVC_PARSE_MODE_HEADER, path.c_str()); });
+bool zel_svc_selective_pass_read_auto_flags(const std::string &path) {
+    return zel_svc_guarded_or(
+        false, [&] { return zel_svc_selective_parse(kAutoFlags, ZEL_SVC_PARSE_MODE_HEADER, path.c_str()); });
 }

@@ -54,8 +54,12 @@ struct ZelSvcPassSequence {
 // holds or lacks, the group's file is rewritten.
 void zel_svc_selective_pass_run(ZelSvcPass pass, const ZelSvcPassSequence &sequence, int lap = ZEL_TIME_LAP_NONE);
 
-// Reads the Auto flags of a customer's file into the parse context; clears them first when there is one.
-void zel_svc_selective_pass_read_auto_flags(const std::string &path);
+// Reads the Auto flags of a customer's file into the parse context. False, and the flags as they were, when the
+// file cannot be read.
+bool zel_svc_selective_pass_read_auto_flags(const std::string &path);
 
-// Parses one customer's file with exactly these elements enabled.
-void zel_svc_selective_parse(std::span<const ZelSvcElementRange> elements, ZelSvcParseMode mode, const char *path);
+// Enables exactly these elements; no element ends the parse early.
+void zel_svc_selective_enable(std::span<const ZelSvcElementRange> elements);
+
+// Parses one customer's file with exactly these elements enabled; false when it cannot be read.
+bool zel_svc_selective_parse(std::span<const ZelSvcElementRange> elements, ZelSvcParseMode mode, const char *path);

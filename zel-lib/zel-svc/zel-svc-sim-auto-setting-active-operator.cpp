@@ -4,6 +4,7 @@
 #include "base/zel-svc-key-text.h"
 #include "base/zel-svc-log.h"
 #include "base/zel-svc-text.h"
+#include "zel-svc-sim-auto-setting-slot.h"
 #include "zel-svc.h"
 
 #include <array>
@@ -13,16 +14,11 @@ namespace {
 
 constexpr const char *kCustomerNameKey = "db/private/zel/sim_auto_op_customer_name"; // one for both slots
 
-struct SlotKey {
-    const char *key;
-    const char *word; // in log messages
-};
-
 struct OperatorField {
     std::size_t offset;
     std::size_t width;      // of the member
     std::size_t read_width; // what a read fills of it
-    std::array<SlotKey, 2> slots;
+    std::array<ZelSvcSimKey, 2> slots;
     bool told; // every write is logged with its value, not failures only
 };
 
@@ -60,22 +56,6 @@ constexpr OperatorField kSlotFields[] = {
 };
 #undef ZEL_MEMBER
 
-struct NamedKey {
-    const char *key;
-    const char *word;
-};
-constexpr NamedKey kSelectionKeys[] = {
-    {"db/private/zel/sim_selection_show", "ZelSimSelectionShow"},
-    {"db/private/zel/sim2/sim_selection_show", "ZelSim2SelectionShow"},
-};
-constexpr NamedKey kIdentityKeys[] = {
-    {"db/private/zel/sim_mcc_mnc", "ZelSimMccMnc"},
-    {"db/private/zel/sim_msin", "ZelSimMsin"},
-    {"db/private/zel/sim2/sim_mcc_mnc", "ZelSim2MccMnc"},
-    {"db/private/zel/sim2/sim_msin", "ZelSim2Msin"},
-};
-constexpr const char *kChangedKeys[] = {"memory/private/zel/sim_changed", "memory/private/zel/sim2/sim_changed"};
-
 std::size_t slot_index(int slot) { return slot == 2 ? 1 : 0; }
 
 std::string member_text(const ZelSvcSimOperator &entry, const OperatorField &field) {
@@ -83,7 +63,7 @@ std::string member_text(const ZelSvcSimOperator &entry, const OperatorField &fie
     return std::string{zel_svc_text_view(bytes, field.width)};
 }
 
-bool write_told(const SlotKey &slot, const std::string &value) {
+bool write_told(const ZelSvcSimKey &slot, const std::string &value) {
     const int result = vconf_set_str(slot.key, value.c_str());
     if (result == 0)
         ZEL_SVC_LOG("vconf_set_str(%s,'%s') succeeded.", slot.word, value.c_str());
@@ -92,7 +72,7 @@ bool write_told(const SlotKey &slot, const std::string &value) {
     return result == 0;
 }
 
-bool write_untold(const SlotKey &slot, const std::string &value) {
+bool write_untold(const ZelSvcSimKey &slot, const std::string &value) {
     const int result = vconf_set_str(slot.key, value.c_str());
     if (result != 0) ZEL_SVC_LOG("vconf_set_str(%s)=%d failed.", slot.word, result);
     return result == 0;
@@ -108,7 +88,7 @@ bool write_operator(const ZelSvcSimOperator &entry, int slot) {
     bool written = write_customer_name(entry);
     for (const OperatorField &field : kSlotFields) {
         const std::string value = member_text(entry, field);
-        const SlotKey &key = field.slots[slot_index(slot)];
+        const ZelSvcSimKey &key = field.slots[slot_index(slot)];
         written = (field.told ? write_told(key, value) : write_untold(key, value)) && written;
     }
     return written;
@@ -116,29 +96,34 @@ bool write_operator(const ZelSvcSimOperator &entry, int slot) {
 
 bool clear_selections() {
     bool cleared = true;
-    for (const NamedKey &key : kSelectionKeys) {
-        const int result = vconf_set_int(key.key, 0);
-        if (result != 0) ZEL_SVC_LOG("vconf_set_int(%s,0)=%d failed.", key.word, result);
+    for (const ZelSvcSimSlot &slot : kZelSvcSimSlots) {
+        const int result = vconf_set_int(slot.selection.key, 0);
+        if (result != 0) ZEL_SVC_LOG("vconf_set_int(%s,0)=%d failed.", slot.selection.word, result);
         cleared = result == 0 && cleared;
     }
     return cleared;
 }
 
+bool clear_text(const ZelSvcSimKey &key) {
+    const int result = vconf_set_str(key.key, "");
+    if (result != 0) ZEL_SVC_LOG("vconf_set_str(%s,'')=%d failed.", key.word, result);
+    return result == 0;
+}
+
 // Without a stored identity, every inserted SIM counts as another one.
 bool clear_identities() {
     bool cleared = true;
-    for (const NamedKey &key : kIdentityKeys) {
-        const int result = vconf_set_str(key.key, "");
-        if (result != 0) ZEL_SVC_LOG("vconf_set_str(%s,'')=%d failed.", key.word, result);
-        cleared = result == 0 && cleared;
+    for (const ZelSvcSimSlot &slot : kZelSvcSimSlots) {
+        cleared = clear_text(slot.mccmnc) && cleared;
+        cleared = clear_text(slot.msin) && cleared;
     }
     return cleared;
 }
 
 bool clear_changed_flags() {
     bool cleared = true;
-    for (const char *key : kChangedKeys)
-        cleared = vconf_set_bool(key, 0) == 0 && cleared;
+    for (const ZelSvcSimSlot &slot : kZelSvcSimSlots)
+        cleared = vconf_set_bool(slot.changed.key, 0) == 0 && cleared;
     return cleared;
 }
 

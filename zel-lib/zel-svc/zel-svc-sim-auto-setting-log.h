@@ -1,0 +1,26 @@
+#pragma once
+// What SIM auto setting decided, for people: a check log and a setting log for each slot.
+//
+//     zel_svc_sim_log_append(slot.check_log, zel_svc_sim_message("SIM%d normally inserted.", slot.number));
+//
+// An MSIN identifies a subscriber: no log ever holds more than its first three digits.
+
+#include "base/zel-svc-text.h"
+#include "zel-svc.h"
+
+#include <string>
+#include <string_view>
+
+using ZelSvcSimMessage = FixedText<306>;
+
+// A formatted message, cut to 305 bytes.
+__attribute__((format(printf, 1, 2))) ZelSvcSimMessage zel_svc_sim_message(const char *format, ...);
+
+// Appends a message and a newline to a log; a log that cannot be opened is passed over.
+void zel_svc_sim_log_append(const char *path, const ZelSvcSimMessage &message);
+
+// As much of an MSIN as a log may hold.
+std::string zel_svc_sim_msin_shown(std::string_view msin);
+
+// "XFV_Vodacom('65501',(Subset)'',(GID)'',(SPName)'')"
+std::string zel_svc_sim_operator_text(const ZelSvcSimOperator &entry);

@@ -1,0 +1,11 @@
+#pragma once
+// The operators that the package offers.
+
+#include "zel-svc.h"
+
+#include <span>
+
+enum class ZelSvcOperatorsOf { ActiveCustomer, AllCustomers };
+
+// Reads the customers' files; what is found belongs to the parse context until the next operator list.
+std::span<const ZelSvcSimOperator> zel_svc_sim_operators(ZelSvcOperatorsOf whose);
