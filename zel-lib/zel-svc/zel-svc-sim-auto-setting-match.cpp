@@ -1,4 +1,4 @@
-// Which of the customer's operators a SIM belongs to.
+#include "zel-svc-sim-auto-setting-match.h"
 
 #include "base/zel-svc-guard.h"
 #include "base/zel-svc-text.h"
@@ -8,15 +8,9 @@
 
 namespace {
 
-enum class Match {
-    None,
-    Plain,    // the network's MCC and MNC, and nothing else to go by
-    Decisive, // what tells this operator from others in the same network
-};
+using Verdict = ZelSvcSimVerdict;
 
 template <std::size_t N> std::string_view text_of(const char (&field)[N]) { return zel_svc_text_view(field, N); }
-
-Match decided(bool matches) { return matches ? Match::Decisive : Match::None; }
 
 char lower(char letter) { return letter >= 'A' && letter <= 'Z' ? static_cast<char>(letter - 'A' + 'a') : letter; }
 
@@ -26,36 +20,47 @@ bool equal_but_for_case(std::string_view one, std::string_view other) {
 }
 
 // The first thing that an entry asks for decides; what stands behind it is not looked at.
-Match match(const ZelSvcSimOperator &entry, const ZelSvcSimInfo &sim) {
+Verdict verdict_on(const ZelSvcSimOperator &entry, const ZelSvcSimInfo &sim) {
     const std::string_view mccmnc = text_of(sim.mccmnc);
-    if (mccmnc.empty() || text_of(entry.mccmnc) != mccmnc) return Match::None;
+    if (mccmnc.empty() || text_of(entry.mccmnc) != mccmnc) return Verdict::OtherNetwork;
     const std::string_view subset = text_of(entry.subset_code);
-    if (!subset.empty()) return decided(text_of(sim.msin).substr(0, subset.size()) == subset);
+    if (!subset.empty())
+        return text_of(sim.msin).substr(0, subset.size()) == subset ? Verdict::Decisive : Verdict::OtherMsin;
     const std::string_view gid = text_of(entry.gid);
-    if (!gid.empty()) return decided(text_of(sim.gid) == gid);
+    if (!gid.empty()) return text_of(sim.gid) == gid ? Verdict::Decisive : Verdict::OtherGid;
     const std::string_view sp_name = text_of(entry.sp_name);
-    if (!sp_name.empty()) return decided(equal_but_for_case(text_of(sim.spn), sp_name));
-    return Match::Plain;
+    if (sp_name.empty()) return Verdict::Plain;
+    return equal_but_for_case(text_of(sim.spn), sp_name) ? Verdict::Decisive : Verdict::OtherSpName;
 }
 
-std::int32_t find_matches(const ZelSvcSimInfo &sim, ZelSvcSimOperator *list) {
-    std::int32_t plain = 0;
-    for (const ZelSvcSimOperator &entry : zel_svc_sim_operators(ZelSvcOperatorsOf::ActiveCustomer)) {
-        const Match found = match(entry, sim);
-        if (found == Match::Decisive) {
-            list[0] = entry;
-            return 1;
-        }
-        if (found == Match::Plain) list[plain++] = entry;
-    }
-    return plain;
+// Whether the entry was decisive: then no further one is looked at.
+bool judge(ZelSvcSimMatch &match, std::size_t number, Verdict verdict) {
+    match.verdicts[number] = verdict;
+    if (verdict == Verdict::Plain) match.chosen.push_back(number);
+    if (verdict == Verdict::Decisive) match.chosen.assign(1, number);
+    return verdict == Verdict::Decisive;
+}
+
+std::int32_t copy_matches(const ZelSvcSimInfo &sim, ZelSvcSimOperator *list) {
+    const std::span<const ZelSvcSimOperator> operators = zel_svc_sim_operators(ZelSvcOperatorsOf::ActiveCustomer);
+    const ZelSvcSimMatch match = zel_svc_sim_match(operators, sim);
+    std::transform(match.chosen.begin(), match.chosen.end(), list,
+                   [operators](std::size_t number) { return operators[number]; });
+    return static_cast<std::int32_t>(match.chosen.size());
 }
 
 } // namespace
+
+ZelSvcSimMatch zel_svc_sim_match(std::span<const ZelSvcSimOperator> operators, const ZelSvcSimInfo &sim) {
+    ZelSvcSimMatch match{std::vector<Verdict>(operators.size(), Verdict::NotLookedAt), {}};
+    for (std::size_t number = 0; number < operators.size(); ++number)
+        if (judge(match, number, verdict_on(operators[number], sim))) break;
+    return match;
+}
 
 void zel_svc_sim_auto_setting_get_operator_list_by_sim(const ZelSvcSimInfo *info, ZelSvcSimOperator *list,
                                                        int32_t *count) {
     if (!info || !list || !count) return;
     *count = 0;
-    *count = zel_svc_guarded_or(0, [=] { return find_matches(*info, list); });
+    *count = zel_svc_guarded_or(0, [=] { return copy_matches(*info, list); });
 }

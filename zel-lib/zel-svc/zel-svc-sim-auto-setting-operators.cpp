@@ -25,11 +25,15 @@ struct CustomerFile {
     std::string path;
 };
 
+std::vector<CustomerFile> file_of_customer(std::string_view code) {
+    const std::string_view customer = zel_svc_internal_customer(code);
+    return {{std::string{customer}, zel_svc_customer_spec_path(customer)}};
+}
+
 std::vector<CustomerFile> file_of_active_customer() {
     FixedText<10> active;
     if (zel_svc_config_get_active_customer_name(active.data(), static_cast<int>(active.width)) == 0) return {};
-    const std::string_view customer = zel_svc_internal_customer(active.view());
-    return {{std::string{customer}, zel_svc_customer_spec_path(customer)}};
+    return file_of_customer(active.view());
 }
 
 CustomerFile file_of(const ZelSvcCustomer &customer) {
@@ -60,17 +64,24 @@ void collect(const CustomerFile &file) {
     zel_svc_spec_parse_file(ZEL_SVC_PARSE_ACTION_INSTALL, file.path.c_str(), 0);
 }
 
-} // namespace
-
-std::span<const ZelSvcSimOperator> zel_svc_sim_operators(ZelSvcOperatorsOf whose) {
-    const std::vector<CustomerFile> files =
-        whose == ZelSvcOperatorsOf::AllCustomers ? files_of_all_customers() : file_of_active_customer();
+std::span<const ZelSvcSimOperator> operators_in(const std::vector<CustomerFile> &files) {
     if (files.empty()) return {};
     prepare_parse();
     for (const CustomerFile &file : files)
         zel_svc_guarded([&] { collect(file); });
     const ZelSvcOperatorList &operators = zel_svc_collected_operators();
     return {operators.entries.data(), static_cast<std::size_t>(operators.count)};
+}
+
+} // namespace
+
+std::span<const ZelSvcSimOperator> zel_svc_sim_operators(ZelSvcOperatorsOf whose) {
+    return operators_in(whose == ZelSvcOperatorsOf::AllCustomers ? files_of_all_customers()
+                                                                 : file_of_active_customer());
+}
+
+std::span<const ZelSvcSimOperator> zel_svc_sim_operators_of(std::string_view customer) {
+    return operators_in(file_of_customer(customer));
 }
 
 void zel_svc_sim_auto_setting_get_operator_list(ZelSvcSimOperator *list, int32_t *count, int all_customers) {
