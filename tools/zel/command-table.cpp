@@ -2,8 +2,11 @@
 
 #include "commands.h"
 #include "phone-verbs.h"
+#include "sim-command-table.h"
 
 #include <algorithm>
+#include <array>
+#include <iterator>
 
 namespace zel_command {
 namespace {
@@ -115,8 +118,8 @@ std::vector<Command> own_commands() {
 const std::vector<Command> &command_table() {
     static const std::vector<Command> table = [] {
         std::vector<Command> rows = own_commands();
-        for (Command &row : phone_verb_commands())
-            rows.push_back(std::move(row));
+        for (std::vector<Command> &more : std::array{sim_commands(), phone_verb_commands()})
+            std::move(more.begin(), more.end(), std::back_inserter(rows));
         return rows;
     }();
     return table;

@@ -33,6 +33,24 @@ int vconf_set(Invocation &invocation);
 int vconf_unset(Invocation &invocation);
 int vconf_list(Invocation &invocation);
 
+// sim-cards.cpp
+int sim_insert(Invocation &invocation);
+int sim_remove(Invocation &invocation);
+
+// sim-slots.cpp
+int sim_info(Invocation &invocation);
+int sim_active(Invocation &invocation);
+
+// sim-runs.cpp
+int sim_run(Invocation &invocation);
+int sim_install(Invocation &invocation);
+int sim_clear(Invocation &invocation);
+
+// sim-operators.cpp, sim-match.cpp, sim-matrix-page.cpp
+int sim_operators(Invocation &invocation);
+int sim_match(Invocation &invocation);
+int sim_matrix(Invocation &invocation);
+
 // phone-verbs.cpp
 int phone_verb(Invocation &invocation);
 

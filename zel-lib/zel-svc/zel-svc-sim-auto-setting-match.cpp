@@ -33,12 +33,13 @@ Verdict verdict_on(const ZelSvcSimOperator &entry, const ZelSvcSimInfo &sim) {
     return equal_but_for_case(text_of(sim.spn), sp_name) ? Verdict::Decisive : Verdict::OtherSpName;
 }
 
-// Whether the entry was decisive: then no further one is looked at.
-bool judge(ZelSvcSimMatch &match, std::size_t number, Verdict verdict) {
-    match.verdicts[number] = verdict;
-    if (verdict == Verdict::Plain) match.chosen.push_back(number);
-    if (verdict == Verdict::Decisive) match.chosen.assign(1, number);
-    return verdict == Verdict::Decisive;
+std::vector<std::size_t> choice(const std::vector<Verdict> &verdicts) {
+    std::vector<std::size_t> plain;
+    for (std::size_t number = 0; number < verdicts.size(); ++number) {
+        if (verdicts[number] == Verdict::Decisive) return {number};
+        if (verdicts[number] == Verdict::Plain) plain.push_back(number);
+    }
+    return plain;
 }
 
 std::int32_t copy_matches(const ZelSvcSimInfo &sim, ZelSvcSimOperator *list) {
@@ -52,10 +53,11 @@ std::int32_t copy_matches(const ZelSvcSimInfo &sim, ZelSvcSimOperator *list) {
 } // namespace
 
 ZelSvcSimMatch zel_svc_sim_match(std::span<const ZelSvcSimOperator> operators, const ZelSvcSimInfo &sim) {
-    ZelSvcSimMatch match{std::vector<Verdict>(operators.size(), Verdict::NotLookedAt), {}};
-    for (std::size_t number = 0; number < operators.size(); ++number)
-        if (judge(match, number, verdict_on(operators[number], sim))) break;
-    return match;
+    std::vector<Verdict> verdicts;
+    for (const ZelSvcSimOperator &entry : operators)
+        verdicts.push_back(verdict_on(entry, sim));
+    std::vector<std::size_t> chosen = choice(verdicts);
+    return {std::move(verdicts), std::move(chosen)};
 }
 
 void zel_svc_sim_auto_setting_get_operator_list_by_sim(const ZelSvcSimInfo *info, ZelSvcSimOperator *list,

@@ -16,12 +16,11 @@ enum class ZelSvcSimVerdict {
     OtherSpName,  // not the SIM's service provider name
     Plain,        // the SIM's MCC and MNC, and nothing else to go by
     Decisive,     // the SIM has what tells this operator from others in the same network
-    NotLookedAt,  // an earlier entry was decisive
 };
 
 struct ZelSvcSimMatch {
-    std::vector<ZelSvcSimVerdict> verdicts; // of every entry
-    std::vector<std::size_t> chosen;        // the decisive entry alone, or all plain ones, in their order
+    std::vector<ZelSvcSimVerdict> verdicts; // of every entry, by itself
+    std::vector<std::size_t> chosen;        // the first decisive entry alone, or all plain ones, in their order
 };
 
 ZelSvcSimMatch zel_svc_sim_match(std::span<const ZelSvcSimOperator> operators, const ZelSvcSimInfo &sim);

@@ -1,0 +1,35 @@
+#pragma once
+// SIM cards and slots, as the commands of SIM auto setting show and name them.
+
+#include "invocation.h"
+
+#include <zel-svc.h>
+
+#include <string>
+#include <string_view>
+#include <vector>
+
+namespace zel_command {
+
+// The slot that --slot names, 1 without it. Throws a Failure when the phone has no such slot.
+int chosen_slot(const Invocation &invocation);
+// Every slot of the phone, or the one that --slot names.
+std::vector<int> chosen_slots(const Invocation &invocation);
+
+// As much of a subscriber number as people may see: its first three digits.
+std::string shown_msin(std::string_view msin, bool reveal);
+
+// A card that --mccmnc, --msin, --gid and --spn describe. Throws a Failure when it is none.
+ZelSvcSimInfo described_card(const Invocation &invocation);
+
+// "21405, MSIN 987***, GID A3, SPN Orange"; what the card lacks is left out.
+std::string card_text(const ZelSvcSimInfo &card, bool reveal);
+Json card_json(const ZelSvcSimInfo &card, bool reveal);
+
+// A field of a record of the library.
+template <std::size_t N> std::string field_text(const char (&field)[N]) {
+    const std::string_view bytes{field, N};
+    return std::string{bytes.substr(0, bytes.find('\0'))};
+}
+
+} // namespace zel_command
