@@ -38,7 +38,7 @@ extern "C" {
 #define ZEL_SVC_API
 #endif
 
-enum { ZEL_SVC_MAX_CUSTOMERS = 120, ZEL_SVC_MAX_OPERATORS = 270, ZEL_SVC_MAX_LOCKS = 70 };
+enum { ZEL_SVC_MAX_CUSTOMERS = 120, ZEL_SVC_MAX_OPERATORS = 270, ZEL_SVC_MAX_LOCKS = 70, ZEL_SVC_MAX_RESULTS = 1000 };
 
 /* What an install is for. */
 typedef enum {
@@ -231,6 +231,41 @@ ZEL_SVC_API int zel_svc_config_chk_approval_version_exist(void);
  * afresh and records the locks there.
  */
 ZEL_SVC_API int zel_svc_config_get_security_lock_info(ZelSvcSecurityLock *result);
+
+/*
+ * Verification and export: is this phone what its package says, and what does it say itself?
+ */
+
+/*
+ * Compares the phone with the active customer's file and writes the report,
+ * "/opt/system/zel-default/output/zel-verification-report.log". `results` must hold ZEL_SVC_MAX_RESULTS entries;
+ * `count` is set to how many were filled, in the order of the report, and what comes behind the last one is lost:
+ *   "[FS] media/wallpaper size 4096=>4096"              media folders, after the install and now
+ *   "[App][Customer1] com.example.shop(tpk,install)"    what the package tool reported
+ *   "[Spec][GPS/GPSActivation] Spec='on',Phone='off'"   the customer's file; "??" is a value that cannot be read
+ * Without the figures of an install there are no lines of the first kind. What the customer's Auto flags leave to
+ * the SIM card is not compared. Only failed lines of the third kind make the report say "NOT OK!" and count there
+ * as failures; those of the other two are marked in their lines. Returns 1, or 0 when the report cannot be opened:
+ * the list is filled all the same. Without an active customer there are no lines of the third kind.
+ * Writes: the report; "/opt/system/zel-default/output/zel-fs-status-verify.ini"; the keys that
+ * zel_svc_config_get_zel_bin_version() writes.
+ */
+ZEL_SVC_API int zel_svc_config_verification(ZelSvcVerificationResult *results, int32_t *count);
+
+/*
+ * The same for tools that want one answer: how many lines of any kind failed, and the first of them in `buffer`,
+ * which is empty when none did. Without an active customer 1 and "Pre-configuration not found!". `buffer` may be
+ * null.
+ */
+ZEL_SVC_API int zel_svc_config_verification_for_imei(char *buffer, int size);
+
+/*
+ * Writes the phone's present settings as a customer's file,
+ * "/opt/system/zel-default/output/customer-phone.xml". What that format cannot carry is listed in the
+ * documentation; the networks among it, so a package needs them added before it can install the profiles. Returns
+ * 0, and leaves an earlier document as it was, when the file cannot be written or memory ran out.
+ */
+ZEL_SVC_API int zel_svc_config_encoding_xml(void);
 
 /*
  * SIM auto setting: on phones whose SIM card decides the operator, the platform calls

@@ -18,12 +18,14 @@ std::string attributes_of(const ZelSvcXmlAttribute *attribute) {
     return text;
 }
 
-void record(const char *kind, std::size_t row, const Occurrence &occurrence) {
+void record(const char *kind, std::size_t row, Occurrence &occurrence) {
     const std::string_view tag = kElementRows[row].tag;
     std::string text = std::string(kind) + " " + std::string(tag) + attributes_of(occurrence.attributes);
     if (!occurrence.text.empty()) text += " " + std::string(occurrence.text);
     if (static_cast<std::size_t>(occurrence.element) != row) text += " in " + std::string(occurrence.tag);
     calls().push_back({text, occurrence});
+    const auto given = export_texts().find(text);
+    if (occurrence.out && given != export_texts().end()) occurrence.out->assign(given->second);
     if (occurrence.text == "no memory") throw std::bad_alloc();
 }
 
@@ -54,6 +56,11 @@ std::vector<std::string> call_texts() {
     std::vector<std::string> texts;
     for (const Call &call : calls())
         texts.push_back(call.text);
+    return texts;
+}
+
+std::map<std::string, std::string> &export_texts() {
+    static std::map<std::string, std::string> texts;
     return texts;
 }
 

@@ -4,6 +4,7 @@
 
 #include "spec/zel-svc-occurrence.h"
 
+#include <map>
 #include <string>
 #include <vector>
 
@@ -16,6 +17,9 @@ struct Call {
 
 std::vector<Call> &calls();
 std::vector<std::string> call_texts();
+
+// What a handler gives out in an export: of "start Wallpaper" an attribute text, of "value GPS" a value.
+std::map<std::string, std::string> &export_texts();
 
 // How often a parse began.
 int begun_parses();

@@ -58,6 +58,23 @@ void approval(char ** /*none*/) {
     std::printf("%d ap='%s' cp='%s' zel='%s'\n", result, versions.ap, versions.cp, versions.zel);
 }
 
+// The lines are in the report.
+void verify(char ** /*none*/) {
+    const auto results = std::make_unique<ZelSvcVerificationResult[]>(ZEL_SVC_MAX_RESULTS);
+    int count = 0;
+    const int result = zel_svc_config_verification(results.get(), &count);
+    int passed = 0;
+    for (int i = 0; i < count; ++i)
+        passed += results[static_cast<unsigned>(i)].passed;
+    std::printf("%d, %d lines, %d passed\n", result, count, passed);
+}
+
+void verify_for_imei(char ** /*none*/) {
+    char line[306] = "";
+    const int result = zel_svc_config_verification_for_imei(line, sizeof line);
+    print_text(result, line);
+}
+
 void install(char **arguments) { zel_svc_config_install_customer(arguments[0], std::atoi(arguments[1])); }
 
 constexpr Step kSteps[] = {
@@ -75,6 +92,9 @@ constexpr Step kSteps[] = {
     {"customers", 0, customers},
     {"version", 0, version},
     {"approval", 0, approval},
+    {"verify", 0, verify},
+    {"verify-for-imei", 0, verify_for_imei},
+    {"export", 0, [](char **) { std::printf("%d\n", zel_svc_config_encoding_xml()); }},
 };
 
 } // namespace

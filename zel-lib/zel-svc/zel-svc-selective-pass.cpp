@@ -80,10 +80,11 @@ void zel_svc_selective_enable(std::span<const ZelSvcElementRange> elements) {
             zel_svc_element_enable(static_cast<ZelSvcElementId>(id));
 }
 
-bool zel_svc_selective_parse(std::span<const ZelSvcElementRange> elements, ZelSvcParseMode mode, const char *path) {
+bool zel_svc_selective_parse(std::span<const ZelSvcElementRange> elements, ZelSvcParseMode mode, const char *path,
+                             ZelSvcParseAction action) {
     zel_svc_selective_enable(elements);
     geZelSvcParseMode = mode;
-    return zel_svc_spec_parse_file(ZEL_SVC_PARSE_ACTION_INSTALL, path, 0) == 1;
+    return zel_svc_spec_parse_file(action, path, 0) == 1;
 }
 
 void zel_svc_selective_pass_run(ZelSvcPass id, const ZelSvcPassSequence &sequence, int lap) {
@@ -102,7 +103,7 @@ void zel_svc_selective_pass_run(ZelSvcPass id, const ZelSvcPassSequence &sequenc
     __zel_svc_config_time_lap_end(lap);
 }
 
-bool zel_svc_selective_pass_read_auto_flags(const std::string &path) {
+bool zel_svc_selective_pass_read_auto_flags(const std::string &path, ZelSvcParseAction action) {
     return zel_svc_guarded_or(
-        false, [&] { return zel_svc_selective_parse(kAutoFlags, ZEL_SVC_PARSE_MODE_HEADER, path.c_str()); });
+        false, [&] { return zel_svc_selective_parse(kAutoFlags, ZEL_SVC_PARSE_MODE_HEADER, path.c_str(), action); });
 }

@@ -56,10 +56,12 @@ void zel_svc_selective_pass_run(ZelSvcPass pass, const ZelSvcPassSequence &seque
 
 // Reads the Auto flags of a customer's file into the parse context. False, and the flags as they were, when the
 // file cannot be read.
-bool zel_svc_selective_pass_read_auto_flags(const std::string &path);
+bool zel_svc_selective_pass_read_auto_flags(const std::string &path,
+                                            ZelSvcParseAction action = ZEL_SVC_PARSE_ACTION_INSTALL);
 
 // Enables exactly these elements; no element ends the parse early.
 void zel_svc_selective_enable(std::span<const ZelSvcElementRange> elements);
 
 // Parses one customer's file with exactly these elements enabled; false when it cannot be read.
-bool zel_svc_selective_parse(std::span<const ZelSvcElementRange> elements, ZelSvcParseMode mode, const char *path);
+bool zel_svc_selective_parse(std::span<const ZelSvcElementRange> elements, ZelSvcParseMode mode, const char *path,
+                             ZelSvcParseAction action = ZEL_SVC_PARSE_ACTION_INSTALL);

@@ -4,15 +4,11 @@
 #include "base/zel-svc-folder-walk.h"
 #include "base/zel-svc-ini.h"
 
-#include <array>
 #include <cstdint>
 #include <fcntl.h>
 #include <string>
 
 namespace {
-
-constexpr std::array kCategories = {"wallpaper", "ringtone", "alerttone", "alarmtone", "image",
-                                    "sound",     "video",    "others",    "camera",    "screenshot"};
 
 // A category may count several folders.
 struct MediaFolder {
@@ -68,9 +64,9 @@ void __zel_svc_config_fs_status_write(int mode) {
     const ZelSvcFd file = zel_svc_file_open(path, O_RDWR | O_CREAT | O_TRUNC, 0644);
     ZelSvcIni ini = ZelSvcIni::load(file.get());
     if (!ini) return;
-    for (std::size_t i = 0; i < kCategories.size(); ++i) {
+    for (std::size_t i = 0; i < ZEL_SVC_FS_STATUS_CATEGORIES.size(); ++i) {
         const Total total = total_of(i);
-        const std::string key = std::string{"media:"} + kCategories[i];
+        const std::string key = std::string{"media:"} + ZEL_SVC_FS_STATUS_CATEGORIES[i];
         ini.add_section("media");
         ini.set(key + "_size", std::to_string(total.size));
         ini.set(key + "_count", std::to_string(total.count));

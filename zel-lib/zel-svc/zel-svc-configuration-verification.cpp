@@ -1,0 +1,91 @@
+// Whether the phone is what its customer's specification says.
+
+#include "zel-svc-configuration-verification.h"
+
+#include "base/zel-svc-active-customer.h"
+#include "base/zel-svc-guard.h"
+#include "base/zel-svc-text.h"
+#include "spec/zel-svc-verification.h"
+
+#include <algorithm>
+#include <array>
+
+namespace {
+
+using SalesCode = FixedText<ZEL_SVC_SALES_CODE_SIZE>;
+constexpr int kCodeSize = SalesCode::width;
+constexpr int kVersionSize = 20;
+
+// Empty without an active customer.
+SalesCode active_customer() {
+    SalesCode code;
+    zel_svc_config_get_active_customer_name(code.data(), kCodeSize);
+    return code;
+}
+
+struct Verified {
+    ZelSvcVerifiedPhone phone;
+    SalesCode folder; // of the customer's file
+};
+
+Verified who_is_verified() {
+    const SalesCode code = active_customer();
+    Verified verified;
+    const int differs = zel_svc_config_get_internal_customer_name(code.c_str(), verified.folder.data(), kCodeSize);
+    FixedText<kVersionSize> version;
+    zel_svc_config_get_zel_bin_version(version.data(), kVersionSize);
+    verified.phone = {.package_version = version.c_str(),
+                      .sales_code = code.c_str(),
+                      .internal_name = differs == 1 ? verified.folder.c_str() : ""};
+    return verified;
+}
+
+// Each part goes on where another one ran out of memory.
+int verify(ZelSvcResultList &list) {
+    const Verified verified = who_is_verified();
+    zel_svc_guarded([&] { zel_svc_config_verify_media(list); });
+    zel_svc_guarded([&] { zel_svc_config_verify_applications(list); });
+    int failed = 0;
+    zel_svc_guarded([&] { failed = zel_svc_config_verify_spec(verified.folder.view(), list); });
+    return zel_svc_config_write_report(verified.phone, list, failed) ? 1 : 0;
+}
+
+// Of the one verification that runs at a time: too large for a caller's stack.
+std::array<ZelSvcVerificationResult, ZEL_SVC_MAX_RESULTS> gResults;
+
+int count_failures(char *buffer, std::size_t size) {
+    std::int32_t count = 0;
+    zel_svc_config_verification(gResults.data(), &count);
+    zel_svc_text_copy(buffer, size, {});
+    const auto end = gResults.begin() + count;
+    const auto failed = [](const ZelSvcVerificationResult &result) { return result.passed == 0; };
+    const auto first = std::find_if(gResults.begin(), end, failed);
+    if (first != end) zel_svc_text_copy(buffer, size, zel_svc_text_view(first->text, sizeof first->text));
+    return static_cast<int>(std::count_if(first, end, failed));
+}
+
+} // namespace
+
+void ZelSvcResultList::add(std::string_view text, bool passed) {
+    if (is_full()) return;
+    ZelSvcVerificationResult &entry = results_[(*count_)++];
+    zel_svc_text_copy(entry.text, sizeof entry.text, text);
+    entry.passed = passed ? 1 : 0;
+}
+
+int zel_svc_config_verification(ZelSvcVerificationResult *results, int32_t *count) {
+    if (!results || !count) return 0;
+    ZelSvcResultList list{results, count};
+    const int written = zel_svc_guarded_or(0, [&] { return verify(list); });
+    zel_svc_verification_clear_results();
+    return written;
+}
+
+int zel_svc_config_verification_for_imei(char *buffer, int size) {
+    const std::size_t room = buffer ? zel_svc_buffer_size(size) : 0;
+    if (active_customer().empty()) {
+        zel_svc_text_copy(buffer, room, "Pre-configuration not found!");
+        return 1;
+    }
+    return count_failures(buffer, room);
+}
