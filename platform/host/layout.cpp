@@ -23,6 +23,15 @@ CREATE TABLE tool (path TEXT PRIMARY KEY, status INTEGER NOT NULL, file TEXT NOT
                    content TEXT NOT NULL) WITHOUT ROWID;
 CREATE TABLE modem (slot INTEGER PRIMARY KEY, name TEXT NOT NULL, state INTEGER NOT NULL, mcc TEXT, mnc TEXT,
                     msin TEXT, gid TEXT, spn TEXT, result INTEGER);
+CREATE TABLE bookmark (id INTEGER PRIMARY KEY, parent INTEGER NOT NULL, folder INTEGER NOT NULL,
+                       editable INTEGER NOT NULL, title TEXT NOT NULL, url TEXT NOT NULL);
+INSERT INTO bookmark VALUES (1, 0, 1, 0, 'Bookmarks', '');
+CREATE TABLE sync_account (id INTEGER PRIMARY KEY, attribute INTEGER NOT NULL, name TEXT NOT NULL,
+                           address TEXT NOT NULL, user_id TEXT NOT NULL, password TEXT NOT NULL,
+                           sync_mode INTEGER NOT NULL, sync_type INTEGER NOT NULL, sync_interval INTEGER NOT NULL);
+CREATE TABLE sync_service (account INTEGER NOT NULL, type INTEGER NOT NULL, enabled INTEGER NOT NULL,
+                           source INTEGER NOT NULL, name TEXT, database_id TEXT, password TEXT,
+                           PRIMARY KEY (account, type)) WITHOUT ROWID;
 )";
 
 // The telephony side reads pdp_profile by position: columns 24 and 25 follow one that only it writes.

@@ -1,11 +1,13 @@
 #include "package.h"
 
+#include "bookmarks.h"
 #include "clock.h"
 #include "content.h"
 #include "fault.h"
 #include "layout.h"
 #include "modem.h"
 #include "open-file.h"
+#include "sync-accounts.h"
 #include "system-log.h"
 #include "verb.h"
 
@@ -57,6 +59,8 @@ bool take_away(Phone &phone) {
 void forget(Phone &phone) {
     phone.store().execute("DELETE FROM vconf; DELETE FROM attribute; DELETE FROM journal; DELETE FROM tool;"
                           "DELETE FROM record WHERE name <> 'slots'");
+    clear_bookmarks(phone);
+    clear_sync_accounts(phone);
     clear_faults(phone);
     clear_log(phone);
     run_clock(phone);

@@ -42,8 +42,8 @@ std::set<std::string> exported() {
 
 TEST(Symbols, AreTheDeclaredFunctions) {
     std::set<std::string> declared;
-    for (const char *header :
-         {"db-util", "device-power", "dlog", "security-server", "smack", "telephony", "theme", "vconf", "zel-platform"})
+    for (const char *header : {"bookmark", "db-util", "device-power", "dlog", "security-server", "smack", "sync-agent",
+                               "telephony", "theme", "vconf", "zel-platform"})
         add_declared(std::string("/platform/include/") + header + ".h", declared);
     add_declared("/platform/host/zel-host.h", declared);
     EXPECT_GE(declared.size(), 32U);

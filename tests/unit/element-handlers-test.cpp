@@ -50,9 +50,8 @@ std::string events(const ZelSvcElement &row) {
     return std::string(row.start ? "s" : "") + (row.value ? "v" : "") + (row.end ? "e" : "");
 }
 
-// Everything from the browser to data sync: rows of these groups
-// have their handlers or none.
-bool may_have_none(std::size_t row) { return row >= 204 && row <= 278; }
+// Connections: its rows have their handlers or none.
+bool may_have_none(std::size_t row) { return row >= 219 && row <= 259; }
 
 } // namespace
 

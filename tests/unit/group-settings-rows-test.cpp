@@ -6,6 +6,7 @@
 namespace zel_test {
 
 INSTANTIATE_TEST_SUITE_P(Personal, WordSetting, testing::ValuesIn(kExpectedPersonal), word_setting_name);
+INSTANTIATE_TEST_SUITE_P(Browser, WordSetting, testing::ValuesIn(kExpectedBrowser), word_setting_name);
 INSTANTIATE_TEST_SUITE_P(Sms, WordSetting, testing::ValuesIn(kExpectedSms), word_setting_name);
 INSTANTIATE_TEST_SUITE_P(Mms, WordSetting, testing::ValuesIn(kExpectedMms), word_setting_name);
 
@@ -17,6 +18,11 @@ TEST(PersonalSettings, EveryRowHasItsTests) {
     EXPECT_EQ(elements_with_keys({zel_svc_gps_settings(), zel_svc_contact_settings(), zel_svc_multimedia_settings(),
                                   zel_svc_connectivity_settings()}),
               tested);
+}
+
+TEST(BrowserSettings, EveryRowHasItsTests) {
+    EXPECT_EQ(elements_with_keys({zel_svc_browser_settings()}),
+              std::set<ZelSvcElementId>{ZEL_SVC_ELEMENT_COOKIE_OPTION});
 }
 
 TEST(MessageSettings, EveryRowHasItsTests) {

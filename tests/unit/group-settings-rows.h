@@ -27,6 +27,7 @@ inline constexpr ExpectedWord kExpiryWords[] = {
 inline constexpr ExpectedWord kDeliveryWords[] = {
     {"imm", 0}, {"1h", 3600}, {"1d", 86400}, {"1w", 604800}, {"custom", 604801}};
 inline constexpr ExpectedWord kCreationWords[] = {{"restricted", 0}, {"warning", 1}, {"free", 2}};
+inline constexpr ExpectedWord kCookieWords[] = {{"accept", 1}, {"reject", 0}};
 inline constexpr ExpectedWord kHomeWords[] = {{"auto", 0}, {"manual", 1}, {"reject", 3}};
 inline constexpr ExpectedWord kRoamingWords[] = {{"auto", 0}, {"manual", 1}, {"restricted", 2}, {"reject", 3}};
 
@@ -50,6 +51,11 @@ inline constexpr ExpectedSetting kExpectedPersonal[] = {
          ZEL_SVC_DATA_CONNECTIVITY, {"bluetooth", "visibility"}, "[Bluetooth/Visibility]"),
     kept(ZEL_SVC_ELEMENT_SLEEP_POLICY, "SleepPolicy", nullptr, false, kSleepWords, "file/private/wifi/sleep_policy",
          ZEL_SVC_DATA_CONNECTIVITY, {"wifi", "sleep_policy"}, "[WiFi/SleepPolicy]"),
+};
+
+inline constexpr ExpectedSetting kExpectedBrowser[] = {
+    kept(ZEL_SVC_ELEMENT_COOKIE_OPTION, "CookieOption", nullptr, false, kCookieWords, "file/private/com.quorvex.browser/cookie",
+         ZEL_SVC_DATA_BROWSER, {"browser", "cookie_opt"}, "[Browser/CookieOption]"),
 };
 
 inline constexpr ExpectedSetting kExpectedSms[] = {

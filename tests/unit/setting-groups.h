@@ -1,6 +1,7 @@
 #pragma once
 // The rows of every group of settings.
 
+#include "zel-svc-element-act-browser.h"
 #include "zel-svc-element-act-connectivity.h"
 #include "zel-svc-element-act-contact.h"
 #include "zel-svc-element-act-gps.h"
@@ -19,7 +20,8 @@ using SettingGroups = std::vector<std::span<const Setting>>;
 inline SettingGroups setting_groups() {
     return {zel_svc_main_settings(),    zel_svc_network_settings(),    zel_svc_gps_settings(),
             zel_svc_contact_settings(), zel_svc_multimedia_settings(), zel_svc_connectivity_settings(),
-            zel_svc_sms_settings(),     zel_svc_push_settings(),       zel_svc_mms_settings()};
+            zel_svc_sms_settings(),     zel_svc_push_settings(),       zel_svc_mms_settings(),
+            zel_svc_browser_settings()};
 }
 
 inline const Setting *setting_row(ZelSvcElementId element) {

@@ -1,6 +1,8 @@
 #include "spec/zel-svc-element-table.h"
 
 #include "zel-svc-element-act-active-sync.h"
+#include "zel-svc-element-act-bookmark.h"
+#include "zel-svc-element-act-browser.h"
 #include "zel-svc-element-act-connectivity.h"
 #include "zel-svc-element-act-contact.h"
 #include "zel-svc-element-act-email-account.h"
@@ -16,7 +18,9 @@
 #include "zel-svc-element-act-multimedia.h"
 #include "zel-svc-element-act-network-info.h"
 #include "zel-svc-element-act-network.h"
+#include "zel-svc-element-act-quick-access.h"
 #include "zel-svc-element-act-security.h"
+#include "zel-svc-element-act-syncml.h"
 #include "zel-svc-element-act-voicemail.h"
 #include "zel-svc-element-act-wb-amr.h"
 
@@ -257,21 +261,21 @@ extern constexpr std::array<ZelSvcElement, ZEL_SVC_ELEMENT_COUNT> kZelSvcElement
     {ZEL_SVC_ELEMENT_PERIOD_CALENDAR,                 "PeriodCalendar",                  "",                  kNone, zel_svc_element_act_active_sync_value, kNone, kOnce, 1},
     // browser, bookmarks, quick access, e-manual
     {ZEL_SVC_ELEMENT_BROWSER,                         "Browser",                         "",                  kNone, kNone, kNone, kOnce, 1},
-    {ZEL_SVC_ELEMENT_COOKIE_OPTION,                   "CookieOption",                    "",                  kNone, kNone, kNone, kOnce, 1},
-    {ZEL_SVC_ELEMENT_NB_BOOKMARK,                     "NbBookmark",                      "",                  kNone, kNone, kNone, kOnce, 1},
-    {ZEL_SVC_ELEMENT_BOOKMARK,                        "Bookmark",                        "",                  kNone, kNone, kNone, kRepeats, 1},
-    {ZEL_SVC_ELEMENT_BOOKMARK_NETWORK_NAME,           "NetworkName",                     "Bookmark",          kNone, kNone, kNone, kRepeats, 1},
-    {ZEL_SVC_ELEMENT_BOOKMARK_EDITABLE,               "Editable",                        "Bookmark",          kNone, kNone, kNone, kRepeats, 1},
-    {ZEL_SVC_ELEMENT_BOOKMARK_FOLDER,                 "Folder",                          "Bookmark",          kNone, kNone, kNone, kRepeats, 1},
-    {ZEL_SVC_ELEMENT_BOOKMARK_NAME,                   "BookmarkName",                    "",                  kNone, kNone, kNone, kRepeats, 1},
-    {ZEL_SVC_ELEMENT_BOOKMARK_URL,                    "URL",                             "Bookmark",          kNone, kNone, kNone, kRepeats, 1},
-    {ZEL_SVC_ELEMENT_NB_QUICK_ACCESS,                 "NbQuickAccess",                   "",                  kNone, kNone, kNone, kOnce, 1},
-    {ZEL_SVC_ELEMENT_QUICK_ACCESS,                    "QuickAccess",                     "",                  kNone, kNone, kNone, kRepeats, 1},
-    {ZEL_SVC_ELEMENT_QUICK_ACCESS_EDITABLE,           "Editable",                        "QuickAccess",       kNone, kNone, kNone, kRepeats, 1},
-    {ZEL_SVC_ELEMENT_QA_TITLE,                        "QATitle",                         "",                  kNone, kNone, kNone, kRepeats, 1},
-    {ZEL_SVC_ELEMENT_QA_URL,                          "QAURL",                           "",                  kNone, kNone, kNone, kRepeats, 1},
+    {ZEL_SVC_ELEMENT_COOKIE_OPTION,                   "CookieOption",                    "",                  kNone, zel_svc_element_act_browser_value, kNone, kOnce, 1},
+    {ZEL_SVC_ELEMENT_NB_BOOKMARK,                     "NbBookmark",                      "",                  kNone, zel_svc_element_act_bookmark_count, kNone, kOnce, 1},
+    {ZEL_SVC_ELEMENT_BOOKMARK,                        "Bookmark",                        "",                  zel_svc_element_act_bookmark_start, kNone, zel_svc_element_act_bookmark_end, kRepeats, 1},
+    {ZEL_SVC_ELEMENT_BOOKMARK_NETWORK_NAME,           "NetworkName",                     "Bookmark",          kNone, zel_svc_element_act_bookmark_value, kNone, kRepeats, 1},
+    {ZEL_SVC_ELEMENT_BOOKMARK_EDITABLE,               "Editable",                        "Bookmark",          kNone, zel_svc_element_act_bookmark_value, kNone, kRepeats, 1},
+    {ZEL_SVC_ELEMENT_BOOKMARK_FOLDER,                 "Folder",                          "Bookmark",          kNone, zel_svc_element_act_bookmark_value, kNone, kRepeats, 1},
+    {ZEL_SVC_ELEMENT_BOOKMARK_NAME,                   "BookmarkName",                    "",                  kNone, zel_svc_element_act_bookmark_value, kNone, kRepeats, 1},
+    {ZEL_SVC_ELEMENT_BOOKMARK_URL,                    "URL",                             "Bookmark",          kNone, zel_svc_element_act_bookmark_value, kNone, kRepeats, 1},
+    {ZEL_SVC_ELEMENT_NB_QUICK_ACCESS,                 "NbQuickAccess",                   "",                  kNone, zel_svc_element_act_quick_access_count, kNone, kOnce, 1},
+    {ZEL_SVC_ELEMENT_QUICK_ACCESS,                    "QuickAccess",                     "",                  zel_svc_element_act_quick_access_start, kNone, zel_svc_element_act_quick_access_end, kRepeats, 1},
+    {ZEL_SVC_ELEMENT_QUICK_ACCESS_EDITABLE,           "Editable",                        "QuickAccess",       kNone, zel_svc_element_act_quick_access_value, kNone, kRepeats, 1},
+    {ZEL_SVC_ELEMENT_QA_TITLE,                        "QATitle",                         "",                  kNone, zel_svc_element_act_quick_access_value, kNone, kRepeats, 1},
+    {ZEL_SVC_ELEMENT_QA_URL,                          "QAURL",                           "",                  kNone, zel_svc_element_act_quick_access_value, kNone, kRepeats, 1},
     {ZEL_SVC_ELEMENT_E_MANUAL,                        "eManual",                         "",                  kNone, kNone, kNone, kOnce, 1},
-    {ZEL_SVC_ELEMENT_E_MANUAL_URL,                    "URL",                             "eManual",           kNone, kNone, kNone, kOnce, 1},
+    {ZEL_SVC_ELEMENT_E_MANUAL_URL,                    "URL",                             "eManual",           kNone, zel_svc_element_act_browser_value, kNone, kOnce, 1},
     // default connections
     {ZEL_SVC_ELEMENT_CONNECTIONS,                     "Connections",                     "",                  kNone, kNone, kNone, kOnce, 1},
     {ZEL_SVC_ELEMENT_NB_PROFILE_HANDLE,               "NbProfileHandle",                 "",                  kNone, kNone, kNone, kOnce, 1},
@@ -316,25 +320,25 @@ extern constexpr std::array<ZelSvcElement, ZEL_SVC_ELEMENT_COUNT> kZelSvcElement
     {ZEL_SVC_ELEMENT_DNS_ENABLE_FLAG,                 "EnableFlag",                      "DNS",               kNone, kNone, kNone, kRepeats, 1},
     {ZEL_SVC_ELEMENT_DNS_IP_ADDR,                     "IPAddr",                          "DNS",               kNone, kNone, kNone, kRepeats, 1},
     // SyncML data sync
-    {ZEL_SVC_ELEMENT_SYNCML,                          "SyncML",                          "",                  kNone, kNone, kNone, kOnce, 1},
-    {ZEL_SVC_ELEMENT_NB_DATA_SYNC,                    "NbDataSync",                      "",                  kNone, kNone, kNone, kOnce, 1},
-    {ZEL_SVC_ELEMENT_DATA_SYNC,                       "DataSync",                        "",                  kNone, kNone, kNone, kRepeats, 1},
-    {ZEL_SVC_ELEMENT_DATA_SYNC_NETWORK_NAME,          "NetworkName",                     "DataSync",          kNone, kNone, kNone, kRepeats, 1},
-    {ZEL_SVC_ELEMENT_DATA_SYNC_ACC_NAME,              "AccName",                         "DataSync",          kNone, kNone, kNone, kRepeats, 1},
-    {ZEL_SVC_ELEMENT_DATA_SYNC_SERV_ADDR,             "ServAddr",                        "DataSync",          kNone, kNone, kNone, kRepeats, 1},
-    {ZEL_SVC_ELEMENT_DATA_SYNC_USER_ID,               "UserId",                          "DataSync",          kNone, kNone, kNone, kRepeats, 1},
-    {ZEL_SVC_ELEMENT_DATA_SYNC_PASSWORD,              "Password",                        "DataSync",          kNone, kNone, kNone, kRepeats, 1},
+    {ZEL_SVC_ELEMENT_SYNCML,                          "SyncML",                          "",                  zel_svc_element_act_syncml_start, kNone, zel_svc_element_act_syncml_end, kOnce, 1},
+    {ZEL_SVC_ELEMENT_NB_DATA_SYNC,                    "NbDataSync",                      "",                  kNone, zel_svc_element_act_data_sync_count, kNone, kOnce, 1},
+    {ZEL_SVC_ELEMENT_DATA_SYNC,                       "DataSync",                        "",                  zel_svc_element_act_data_sync_start, kNone, zel_svc_element_act_data_sync_end, kRepeats, 1},
+    {ZEL_SVC_ELEMENT_DATA_SYNC_NETWORK_NAME,          "NetworkName",                     "DataSync",          kNone, zel_svc_element_act_data_sync_value, kNone, kRepeats, 1},
+    {ZEL_SVC_ELEMENT_DATA_SYNC_ACC_NAME,              "AccName",                         "DataSync",          kNone, zel_svc_element_act_data_sync_value, kNone, kRepeats, 1},
+    {ZEL_SVC_ELEMENT_DATA_SYNC_SERV_ADDR,             "ServAddr",                        "DataSync",          kNone, zel_svc_element_act_data_sync_value, kNone, kRepeats, 1},
+    {ZEL_SVC_ELEMENT_DATA_SYNC_USER_ID,               "UserId",                          "DataSync",          kNone, zel_svc_element_act_data_sync_value, kNone, kRepeats, 1},
+    {ZEL_SVC_ELEMENT_DATA_SYNC_PASSWORD,              "Password",                        "DataSync",          kNone, zel_svc_element_act_data_sync_value, kNone, kRepeats, 1},
     {ZEL_SVC_ELEMENT_DB_LIST,                         "DBList",                          "",                  kNone, kNone, kNone, kRepeats, 1},
     {ZEL_SVC_ELEMENT_CONTACT_DB,                      "ContactDB",                       "",                  kNone, kNone, kNone, kRepeats, 1},
-    {ZEL_SVC_ELEMENT_CONTACT_DB_ENABLE_FLAG,          "EnableFlag",                      "ContactDB",         kNone, kNone, kNone, kRepeats, 1},
-    {ZEL_SVC_ELEMENT_CONTACT_DB_NAME,                 "DBName",                          "ContactDB",         kNone, kNone, kNone, kRepeats, 1},
-    {ZEL_SVC_ELEMENT_CONTACT_DB_ID,                   "DBId",                            "ContactDB",         kNone, kNone, kNone, kRepeats, 1},
-    {ZEL_SVC_ELEMENT_CONTACT_DB_PASSWORD,             "DBPassword",                      "ContactDB",         kNone, kNone, kNone, kRepeats, 1},
+    {ZEL_SVC_ELEMENT_CONTACT_DB_ENABLE_FLAG,          "EnableFlag",                      "ContactDB",         kNone, zel_svc_element_act_data_sync_value, kNone, kRepeats, 1},
+    {ZEL_SVC_ELEMENT_CONTACT_DB_NAME,                 "DBName",                          "ContactDB",         kNone, zel_svc_element_act_data_sync_value, kNone, kRepeats, 1},
+    {ZEL_SVC_ELEMENT_CONTACT_DB_ID,                   "DBId",                            "ContactDB",         kNone, zel_svc_element_act_data_sync_value, kNone, kRepeats, 1},
+    {ZEL_SVC_ELEMENT_CONTACT_DB_PASSWORD,             "DBPassword",                      "ContactDB",         kNone, zel_svc_element_act_data_sync_value, kNone, kRepeats, 1},
     {ZEL_SVC_ELEMENT_CALENDAR_DB,                     "CalendarDB",                      "",                  kNone, kNone, kNone, kRepeats, 1},
-    {ZEL_SVC_ELEMENT_CALENDAR_DB_ENABLE_FLAG,         "EnableFlag",                      "CalendarDB",        kNone, kNone, kNone, kRepeats, 1},
-    {ZEL_SVC_ELEMENT_CALENDAR_DB_NAME,                "DBName",                          "CalendarDB",        kNone, kNone, kNone, kRepeats, 1},
-    {ZEL_SVC_ELEMENT_CALENDAR_DB_ID,                  "DBId",                            "CalendarDB",        kNone, kNone, kNone, kRepeats, 1},
-    {ZEL_SVC_ELEMENT_CALENDAR_DB_PASSWORD,            "DBPassword",                      "CalendarDB",        kNone, kNone, kNone, kRepeats, 1},
+    {ZEL_SVC_ELEMENT_CALENDAR_DB_ENABLE_FLAG,         "EnableFlag",                      "CalendarDB",        kNone, zel_svc_element_act_data_sync_value, kNone, kRepeats, 1},
+    {ZEL_SVC_ELEMENT_CALENDAR_DB_NAME,                "DBName",                          "CalendarDB",        kNone, zel_svc_element_act_data_sync_value, kNone, kRepeats, 1},
+    {ZEL_SVC_ELEMENT_CALENDAR_DB_ID,                  "DBId",                            "CalendarDB",        kNone, zel_svc_element_act_data_sync_value, kNone, kRepeats, 1},
+    {ZEL_SVC_ELEMENT_CALENDAR_DB_PASSWORD,            "DBPassword",                      "CalendarDB",        kNone, zel_svc_element_act_data_sync_value, kNone, kRepeats, 1},
     // GPS
     {ZEL_SVC_ELEMENT_GPS,                             "GPS",                             "",                  kNone, kNone, kNone, kOnce, 1},
     {ZEL_SVC_ELEMENT_GPS_ACTIVATION,                  "GPSActivation",                   "",                  kNone, zel_svc_element_act_gps_value, kNone, kOnce, 1},
@@ -367,6 +371,7 @@ extern constexpr std::array<ZelSvcElement, ZEL_SVC_ELEMENT_COUNT> kZelSvcElement
 
 extern constexpr ZelSvcParseBegin kZelSvcParseBegins[] = {
     zel_svc_element_act_network_info_begin_parse,
+    zel_svc_element_act_syncml_begin_parse,
     nullptr,
 };
 

@@ -1,0 +1,97 @@
+#include "zel-svc-bookmark-service.h"
+
+#include "base/zel-svc-text.h"
+
+#include <bookmark.h>
+
+#include <cstdlib>
+#include <memory>
+
+namespace {
+
+struct Free {
+    void operator()(void *memory) const { std::free(memory); }
+};
+using OwnedText = std::unique_ptr<char, Free>;
+using OwnedIds = std::unique_ptr<int, Free>;
+
+std::string string_of(const OwnedText &text) { return std::string{zel_svc_text_view(text.get())}; }
+
+std::vector<int> list_of(const OwnedIds &ids, int count) {
+    if (!ids || count <= 0) return {};
+    return {ids.get(), ids.get() + count};
+}
+
+// The service takes its texts without changing them.
+char *lent(const std::string &text) { return const_cast<char *>(text.c_str()); } // NOLINT(*-const-cast)
+
+std::optional<int> create(const bookmark_zel_info &info) {
+    int id = 0;
+    if (bookmark_zel_create(&info, &id) != 0) return std::nullopt;
+    return id;
+}
+
+} // namespace
+
+BookmarkService::BookmarkService() : open_{bookmark_zel_initialize() == 0} {}
+
+bool BookmarkService::close() {
+    if (!open_) return false;
+    open_ = false;
+    return bookmark_zel_deinitialize() == 0;
+}
+
+// NOLINTBEGIN(readability-convert-member-functions-to-static)
+std::optional<int> BookmarkService::root() const {
+    int id = 0;
+    if (bookmark_zel_get_root(&id) != 0) return std::nullopt;
+    return id;
+}
+
+std::optional<std::vector<int>> BookmarkService::ids() const {
+    int *raw = nullptr;
+    int count = 0;
+    if (bookmark_zel_get_full_ids_p(&raw, &count) != 0) return std::nullopt;
+    const OwnedIds owned{raw};
+    return list_of(owned, count);
+}
+
+std::optional<BookmarkService::Info> BookmarkService::info(int id) const {
+    bookmark_zel_info raw{};
+    if (bookmark_zel_get_info(id, &raw) != 0) return std::nullopt;
+    const OwnedText title{raw.title};
+    const OwnedText url{raw.url};
+    return Info{.parent = raw.parent, .editable = raw.editable != 0, .title = string_of(title), .url = string_of(url)};
+}
+
+std::optional<std::vector<int>> BookmarkService::folders_titled(const char *title, int parent) const {
+    int *raw = nullptr;
+    int count = 0;
+    if (bookmark_zel_get_duplicated_title_ids_p(title, parent, 1, &raw, &count) != 0) return std::nullopt;
+    const OwnedIds owned{raw};
+    return list_of(owned, count);
+}
+
+std::optional<int> BookmarkService::create_folder(const char *title, int parent) const {
+    const std::string text{title};
+    return create({.is_folder = 1, .parent = parent, .editable = 1, .title = lent(text), .url = nullptr});
+}
+
+std::optional<int> BookmarkService::create_bookmark(const Info &bookmark) const {
+    return create({.is_folder = 0,
+                   .parent = bookmark.parent,
+                   .editable = bookmark.editable ? 1 : 0,
+                   .title = lent(bookmark.title),
+                   .url = lent(bookmark.url)});
+}
+
+void BookmarkService::reset() const { bookmark_zel_reset(); }
+
+std::optional<std::string> BookmarkService::manual_url() const {
+    char *raw = nullptr;
+    if (bookmark_zel_get_user_manual_url(&raw) != 0) return std::nullopt;
+    return string_of(OwnedText{raw});
+}
+
+bool BookmarkService::set_manual_url(const char *url) const { return bookmark_zel_set_user_manual_url(url) == 0; }
+// NOLINTEND(readability-convert-member-functions-to-static)
