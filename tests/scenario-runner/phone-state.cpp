@@ -117,6 +117,24 @@ std::vector<std::string> rows(const std::string &path, const std::string &table)
     return lines;
 }
 
+// One line an entry of a list that a verb answers, its members in the order of their names.
+std::vector<std::string> entries(Phone &phone, const char *verb, const char *list) {
+    std::vector<std::string> lines;
+    const Json answer = phone.call(verb);
+    for (const Json &entry : answer.at(list)) {
+        std::string line;
+        for (const auto &[name, value] : entry.items())
+            if (!value.is_null()) line += (line.empty() ? "" : " ") + name + "=" + shown(value);
+        lines.push_back(line);
+    }
+    return lines;
+}
+
+std::vector<std::string> manual(Phone &phone) {
+    const std::string url = phone.call("bookmarks").at("manual_url");
+    return url.empty() ? std::vector<std::string>{} : std::vector<std::string>{url};
+}
+
 void add(PhoneState &state, const std::string &section, std::vector<std::string> lines) {
     if (!lines.empty()) state[section] = std::move(lines);
 }
@@ -163,6 +181,9 @@ PhoneState read_state(Phone &phone) {
     add(state, "time-laps", file_lines(phone, output + "/zel-time-lap.log"));
     add(state, "fs-status-config", media_status(phone, output + "/zel-fs-status-config.ini"));
     add(state, "fs-status-verify", media_status(phone, output + "/zel-fs-status-verify.ini"));
+    add(state, "bookmarks", entries(phone, "bookmarks", "bookmarks"));
+    add(state, "user-manual", manual(phone));
+    add(state, "sync-accounts", entries(phone, "sync-accounts", "accounts"));
     add(state, "files", files(phone));
     add_section_store(phone, state);
     add_databases(phone, state);

@@ -118,7 +118,7 @@ TEST_F(CheckedBookmark, FailsWhereTheServiceCannotBeAsked) {
                             std::string_view{function} == "bookmark_zel_get_root";
         ASSERT_EQ(lines.size(), 3U) << function;
         EXPECT_EQ(lines[0], counts ? passed("[Bookmark/NbBookmark] Spec='2',Phone='2'")
-                                   : failed("[Bookmark/NbBookmark] Spec='2',Phone='??'"));
+                                   : failed("[Bookmark/NbBookmark] Spec='2',Phone='?\?'"));
         EXPECT_EQ(lines[1], failed("[Bookmark1] Reading phone failed")) << function;
         EXPECT_EQ(lines[2], failed("[Bookmark2] Reading phone failed")) << function;
         const bool opened = std::string_view{function} != "bookmark_zel_initialize";

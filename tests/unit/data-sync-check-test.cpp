@@ -118,7 +118,7 @@ TEST_F(CheckedDataSync, IsNotCheckedWhenItComesFromTheSimOrInOtherModes) {
 TEST_F(CheckedDataSync, WithoutAgentTheCountIsUnknownAndEachAccountFails) {
     fail("sync_agent_ds_init");
     EXPECT_THAT(verify_spec(syncml(leaf("NbDataSync", "2") + account("", "Work") + account("", "Home"))),
-                ElementsAre(failed("[SyncML_DS/NbDataSync] Spec='2',Phone='??'"),
+                ElementsAre(failed("[SyncML_DS/NbDataSync] Spec='2',Phone='?\?'"),
                             failed("[SyncML_DS1] Reading phone failed"), failed("[SyncML_DS2] Reading phone failed")));
     EXPECT_EQ(run_log(), "[SyncML_DS/Error] sync_agent_ds_init() failed.\n");
     EXPECT_EQ(calls_of("sync_agent_ds_deinit"), 0);
@@ -130,7 +130,7 @@ TEST_F(CheckedDataSync, FailsWhereTheAgentCannotBeAsked) {
         const std::vector<ResultLine> lines = verify_spec(syncml(leaf("NbDataSync", "2") + account("", "Work")));
         ASSERT_EQ(lines.size(), 2U) << function;
         EXPECT_EQ(lines[0], function == "sync_agent_ds_get_all_profile"
-                                ? failed("[SyncML_DS/NbDataSync] Spec='2',Phone='??'")
+                                ? failed("[SyncML_DS/NbDataSync] Spec='2',Phone='?\?'")
                                 : passed("[SyncML_DS/NbDataSync] Spec='2',Phone='2'"));
         EXPECT_EQ(lines[1], failed("[SyncML_DS1] Reading phone failed")) << function;
         call("fault-clear");

@@ -176,12 +176,12 @@ TEST_F(EManual, IsNotRecordedWhenTheServiceRefuses) {
 }
 
 TEST_F(EManual, IsVerified) {
-    EXPECT_THAT(verify_spec(spec("http://a")), ElementsAre(failed("[EManual/URL] Spec='http://a',Phone='??'")));
+    EXPECT_THAT(verify_spec(spec("http://a")), ElementsAre(failed("[EManual/URL] Spec='http://a',Phone='?\?'")));
     call("bookmarks-manual", {{"url", "http://a"}});
     EXPECT_THAT(verify_spec(spec("http://a")), ElementsAre(passed("[EManual/URL] Spec='http://a',Phone='http://a'")));
     EXPECT_THAT(verify_spec(spec("http://b")), ElementsAre(failed("[EManual/URL] Spec='http://b',Phone='http://a'")));
     call("bookmarks-manual", {{"url", ""}});
-    EXPECT_THAT(verify_spec(spec("??")), ElementsAre(passed("[EManual/URL] Spec='??',Phone='??'")));
+    EXPECT_THAT(verify_spec(spec("??")), ElementsAre(passed("[EManual/URL] Spec='?\?',Phone='?\?'")));
 }
 
 TEST_F(EManual, IsUnknownWhenTheServiceFails) {
@@ -190,7 +190,7 @@ TEST_F(EManual, IsUnknownWhenTheServiceFails) {
     start_journal();
     for (const char *function : {"bookmark_zel_initialize", "bookmark_zel_get_user_manual_url"}) {
         fail(function, "", 1, 2);
-        EXPECT_THAT(verify_spec(spec("http://a")), ElementsAre(failed("[EManual/URL] Spec='http://a',Phone='??'")));
+        EXPECT_THAT(verify_spec(spec("http://a")), ElementsAre(failed("[EManual/URL] Spec='http://a',Phone='?\?'")));
         EXPECT_EQ(export_value(ZEL_SVC_ELEMENT_E_MANUAL_URL), "??") << function;
     }
     EXPECT_EQ(calls_of("bookmark_zel_deinitialize"), 2);
