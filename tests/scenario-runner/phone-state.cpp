@@ -179,6 +179,8 @@ PhoneState read_state(Phone &phone) {
     add(state, "system-log", system_log(phone));
     add(state, "run-log", file_lines(phone, output + "/zel-config.log"));
     add(state, "time-laps", file_lines(phone, output + "/zel-time-lap.log"));
+    for (const char *log : {"sim-check", "sim-setting", "sim2-check", "sim2-setting"})
+        add(state, log, file_lines(phone, output + "/zel-" + log + ".log"));
     add(state, "fs-status-config", media_status(phone, output + "/zel-fs-status-config.ini"));
     add(state, "fs-status-verify", media_status(phone, output + "/zel-fs-status-verify.ini"));
     add(state, "bookmarks", entries(phone, "bookmarks", "bookmarks"));

@@ -86,9 +86,19 @@ void ScenarioRun::do_step(const ScenarioStep &step) {
         phone_.call("reboot");
     } else if (step.word == "run") {
         run_entry_point(step.rest);
+    } else if (step.word == "show") {
+        const auto [section, text] = split(step.rest);
+        show(section, text);
     } else {
         throw std::runtime_error("unknown step: " + step.word);
     }
+}
+
+void ScenarioRun::show(const std::string &section, const std::string &text) {
+    output_ += "# " + section + (text.empty() ? "" : " " + text) + "\n";
+    const std::vector<std::string> lines = read_state(phone_)[section];
+    for (const std::string &line : lines)
+        if (line.find(text) != std::string::npos) output_ += line + "\n";
 }
 
 StepResult ScenarioRun::run_entry_point(const std::string &words) {

@@ -7,6 +7,8 @@
 //         call vconf-set {"key": ...}    any verb of the bench phone
 //         touch PATH TEXT                a file of the phone, written from outside ("\n" and "\0" are escapes)
 //         run config XFV                 an entry point, in a process of its own; what it prints is kept
+//         show keys /zel/sim             a section of the phone's state as it is now, or its lines with a text,
+//                                        kept with what is printed
 //         restart                        the phone restarts
 //     NAME/phone-before/  files laid into the phone's root before the first step
 //     NAME/package/       a package of the scenario's own
@@ -48,6 +50,7 @@ class ScenarioRun {
 
     void do_step(const ScenarioStep &step);
     StepResult run_entry_point(const std::string &words);
+    void show(const std::string &section, const std::string &text);
 
     Phone &phone() { return phone_; }
     // What the entry points printed, each behind a line "$ WORDS".

@@ -75,6 +75,45 @@ void verify_for_imei(char ** /*none*/) {
     print_text(result, line);
 }
 
+void print_operators(const ZelSvcSimOperator *list, int count) {
+    std::printf("%d operators\n", count);
+    for (int i = 0; i < count; ++i) {
+        const ZelSvcSimOperator &entry = list[i];
+        std::printf("%s %s %s subset='%s' gid='%s' sp='%s'\n", entry.customer_name, entry.network_name, entry.mccmnc,
+                    entry.subset_code, entry.gid, entry.sp_name);
+    }
+}
+
+void sim_operators(char **arguments) {
+    const auto list = std::make_unique<ZelSvcSimOperator[]>(ZEL_SVC_MAX_OPERATORS);
+    int count = 0;
+    zel_svc_sim_auto_setting_get_operator_list(list.get(), &count, std::atoi(arguments[0]));
+    print_operators(list.get(), count);
+}
+
+void sim_matches(char **arguments) {
+    const auto list = std::make_unique<ZelSvcSimOperator[]>(ZEL_SVC_MAX_OPERATORS);
+    ZelSvcSimInfo sim;
+    int count = 0;
+    if (zel_svc_sim_auto_setting_get_sim_info(&sim, std::atoi(arguments[0])) == 1)
+        zel_svc_sim_auto_setting_get_operator_list_by_sim(&sim, list.get(), &count);
+    print_operators(list.get(), count);
+}
+
+// An operator by its customer and network name, as a user's choice from the list gives it.
+void sim_install(char **arguments) {
+    const auto list = std::make_unique<ZelSvcSimOperator[]>(ZEL_SVC_MAX_OPERATORS);
+    int count = 0;
+    zel_svc_sim_auto_setting_get_operator_list(list.get(), &count, 1);
+    for (int i = 0; i < count; ++i) {
+        const ZelSvcSimOperator &entry = list[static_cast<unsigned>(i)];
+        if (std::strcmp(entry.customer_name, arguments[0]) != 0) continue;
+        if (std::strcmp(entry.network_name, arguments[1]) != 0) continue;
+        return zel_svc_sim_auto_setting_install_operator(&entry, std::atoi(arguments[2]));
+    }
+    std::printf("no such operator\n");
+}
+
 void install(char **arguments) { zel_svc_config_install_customer(arguments[0], std::atoi(arguments[1])); }
 
 constexpr Step kSteps[] = {
@@ -95,6 +134,11 @@ constexpr Step kSteps[] = {
     {"verify", 0, verify},
     {"verify-for-imei", 0, verify_for_imei},
     {"export", 0, [](char **) { std::printf("%d\n", zel_svc_config_encoding_xml()); }},
+    {"sim-run", 0, [](char **) { std::printf("%d\n", zel_svc_sim_auto_setting_execute_by_sim()); }},
+    {"sim-feature", 0, [](char **) { std::printf("%d\n", zel_svc_sim_auto_setting_chk_feature_enable()); }},
+    {"sim-operators", 1, sim_operators},
+    {"sim-matches", 1, sim_matches},
+    {"sim-install", 3, sim_install},
 };
 
 } // namespace

@@ -17,6 +17,15 @@ ZelSvcSimOperator some_operator() {
 
 class ActiveOperator : public zel_test::ServicePhone {
   protected:
+    std::vector<std::string> written_keys() {
+        std::vector<std::string> keys;
+        const nlohmann::json list = call("journal-list");
+        for (const nlohmann::json &entry : list.at("calls"))
+            if (entry.at("function").get<std::string>().rfind("vconf_set_", 0) == 0)
+                keys.push_back(entry.at("text").get<std::string>());
+        return keys;
+    }
+
     const ZelSvcSimOperator entry_ = some_operator();
     ZelSvcSimOperator read_ = {};
 };
@@ -104,6 +113,32 @@ TEST_F(ActiveOperator, AnEmptyCustomerNameLeavesTheStoredOne) {
 }
 
 TEST_F(ActiveOperator, NullIsNotStored) { EXPECT_EQ(zel_svc_sim_auto_setting_set_active_operator(nullptr, 1), 0); }
+
+TEST_F(ActiveOperator, KeysAreWrittenInOrder) {
+    call("journal-start");
+    zel_svc_sim_auto_setting_set_active_operator(&entry_, 2);
+    EXPECT_EQ(written_keys(),
+              (std::vector<std::string>{
+                  "db/private/zel/sim_auto_op_customer_name", "db/private/zel/sim2/sim_auto_op_network_name",
+                  "db/private/zel/sim2/sim_auto_op_mcc_mnc", "db/private/zel/sim2/sim_auto_op_subset_code",
+                  "db/private/zel/sim2/sim_auto_op_sp_code", "db/private/zel/sim2/sim_auto_op_sp_name"}));
+}
+
+TEST_F(ActiveOperator, ClearingWritesKeysInOrder) {
+    call("journal-start");
+    zel_svc_sim_auto_setting_clear_active_operator();
+    EXPECT_EQ(
+        written_keys(),
+        (std::vector<std::string>{
+            "db/private/zel/sim_auto_op_network_name", "db/private/zel/sim_auto_op_mcc_mnc",
+            "db/private/zel/sim_auto_op_subset_code", "db/private/zel/sim_auto_op_sp_code",
+            "db/private/zel/sim_auto_op_sp_name", "db/private/zel/sim2/sim_auto_op_network_name",
+            "db/private/zel/sim2/sim_auto_op_mcc_mnc", "db/private/zel/sim2/sim_auto_op_subset_code",
+            "db/private/zel/sim2/sim_auto_op_sp_code", "db/private/zel/sim2/sim_auto_op_sp_name",
+            "db/private/zel/sim_selection_show", "db/private/zel/sim2/sim_selection_show", "db/private/zel/sim_mcc_mnc",
+            "db/private/zel/sim_msin", "db/private/zel/sim2/sim_mcc_mnc", "db/private/zel/sim2/sim_msin",
+            "memory/private/zel/sim_changed", "memory/private/zel/sim2/sim_changed"}));
+}
 
 // Shown in the names of the tests.
 struct RefusedWrite {
