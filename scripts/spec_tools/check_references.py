@@ -48,10 +48,11 @@ def handle_problems(elements: list[Occurrence]) -> Iterator[Problem]:
     for pair, number in profiles.items():
         if number > 1:
             yield 1, f"{number} profiles of {pair[0]!r} have the name {pair[1]!r}"
+    of_every_network = {name for network, name in profiles if network in ("", "default")}
     for handle in (e for e in elements if e.tag == "ProfileHandle"):
         network = handle.child_text("NetworkName")
-        for child in handle.children:
-            if child.tag in _DEFAULT_CONNECTIONS and (network, child.text) not in profiles:
+        for child in (c for c in handle.children if c.tag in _DEFAULT_CONNECTIONS):
+            if (network, child.text) not in profiles and child.text not in of_every_network:
                 yield child.line, f"{child.tag} {child.text!r} is no profile of {network!r}"
 
 

@@ -68,18 +68,57 @@ def of_size(size: int) -> bytes:
     return pieces.document(high)
 
 
+def _network_name(number: int) -> str:
+    return f"Network {number:03}"
+
+
 def _network(number: int) -> spec_file.Element:
     # Country code 001 belongs to test networks.
-    return ("NetworkInfo", [("NetworkName", f"Network {number:03}"), ("MCCMNC", f"001{number:03}")])
+    return ("NetworkInfo", [("NetworkName", _network_name(number)), ("MCCMNC", f"001{number:03}")])
+
+
+def _server(number: int) -> list[spec_file.Element]:
+    """Every fourth profile goes through a proxy with a password."""
+    if number % 4 != 0:
+        return [("Auth", "none"), ("PSparam", [("APN", f"apn{number}.example.com")])]
+    secrets = [("APN", f"apn{number}.example.com"), ("UserId", f"user{number}"), ("Password", f"secret{number}")]
+    return [("Auth", "secure"), ("PSparam", secrets), ("URL", f"http://home{number}.example.com"),
+            ("Proxy", [("ServAddr", "192.0.2.1"), ("Port", str(8000 + number))])]
 
 
 def _profile(number: int, network: str, name: str) -> spec_file.Element:
     return ("Profile", [
         ("NetworkName", network), ("ProfileName", name), ("Editable", "yes"), ("EnableStatus", "enable"),
         ("HiddenStatus", "show"), ("RoamingEnableStatus", "disable"), ("IpVersion", "ipv4v6"),
-        ("RoamingIpVersion", "ipv4"), ("Auth", "none"), ("PSparam", [("APN", f"apn{number}.example.com")]),
+        ("RoamingIpVersion", "ipv4"), *_server(number),
         ("StaticIP", [("EnableFlag", "off")]), ("DNS", [("EnableFlag", "off")]),
     ])
+
+
+def _handle(network: str, browser: str, defaults: int) -> spec_file.Element:
+    """The browser is the network's own profile, messages the first of those for every network."""
+    messages = [("ProfMMS", "Everywhere 1")] if defaults else []
+    return ("ProfileHandle", [("NetworkName", network), ("ProfBrowser", browser), *messages])
+
+
+def _limits(networks: int) -> list[spec_file.Element]:
+    """The first limit of a network stays, so those of single networks come first."""
+    own = range(10, networks + 1, 10)
+    items = [("MaxPDP", [("NetworkName", _network_name(i)), ("MaxPDP2G", "1"), ("MaxPDP3G", "2")]) for i in own]
+    items.append(("MaxPDP", [("NetworkName", "default"), ("MaxPDP2G", "2"), ("MaxPDP3G", "4")]))
+    return [("NbMaxPDP", str(len(items))), *items]
+
+
+def _dormancy_item(network: str, timeout: str, screen: str, *version: spec_file.Element) -> spec_file.Element:
+    return ("FastDormancy", [("NetworkName", network), ("FastDormancyEnableStatus", "on"), ("TimeoutValue", timeout),
+                             ("LCDStatus", screen), *version])
+
+
+def _dormancy(networks: int) -> list[spec_file.Element]:
+    """Every network has both times, every tenth one more for its newer radio."""
+    items = [_dormancy_item("default", "5", "on"), _dormancy_item("default", "2.5", "off")]
+    items += [_dormancy_item(_network_name(i), "32.3", "on", ("Version", "rel8")) for i in range(10, networks + 1, 10)]
+    return [("NbFastDormancy", str(len(items))), *items]
 
 
 def of_networks(code: str, networks: int, profiles: int, defaults: int) -> bytes:
@@ -87,15 +126,23 @@ def of_networks(code: str, networks: int, profiles: int, defaults: int) -> bytes
     elements = [_profile(i, "default", f"Everywhere {i}") for i in range(1, defaults + 1)]
     handles = []
     for i in range(profiles - defaults):
-        network = f"Network {i % networks + 1:03}"
+        network = _network_name(i % networks + 1)
         name = f"Internet {i + 1}"
         elements.append(_profile(defaults + i + 1, network, name))
         if i < min(networks, HANDLES_MAX):
-            handles.append(("ProfileHandle", [("NetworkName", network), ("ProfBrowser", name)]))
+            handles.append(_handle(network, name, defaults))
     connections = ("Connections", [("NbProfileHandle", str(len(handles))), *handles,
                                    ("NbProfile", str(len(elements))), *elements])
     customer = ("CustomerData", [
         ("GeneralInfo", [("SalesCode", code), *(_network(i) for i in range(1, networks + 1))]),
-        ("Settings", [connections]),
+        ("Settings", [("Main", [("Network", [*_limits(networks), *_dormancy(networks)])]), connections]),
     ])
     return spec_file.document(spec_file.render(("SW-Configuration", [customer])))
+
+
+def header_of(code: str) -> bytes:
+    """The header of a package that has this customer only."""
+    customers = ("CustomerDataSet", [("ZELName", "LARGE"), ("ZELVersion", "1"), ("NbCustomer", "1")])
+    body = spec_file.render(("SW-Configuration", [customers]))
+    entry = f'    <CustomerData src="/Customer/{code}/customer.xml"/>\n'
+    return spec_file.document(body.replace("  </CustomerDataSet>", entry + "  </CustomerDataSet>"))

@@ -54,6 +54,13 @@ class Generators(unittest.TestCase):
         self.assertEqual(max(Counter(n for n in of_profiles if n != "default").values()), 2)
         self.assertEqual(sum(e.tag == "ProfileHandle" for e in found), 50)
 
+    def test_a_large_package_has_no_fault(self):
+        package = Path(self.folder.name) / "package"
+        self.assertEqual(run("make-large-customer", 30, 40, package, "--package").returncode, 0)
+        found = run("check-example", package).stderr.splitlines()
+        self.assertIn("row 1: MobileData occurs nowhere", found)
+        self.assertEqual([line for line in found if not line.endswith("occurs nowhere")], [])
+
     def test_senseless_numbers_are_refused(self):
         for arguments in (("make-customer-file", "0", self.out), ("make-large-customer", 0, 1, self.out),
                           ("make-large-customer", 1, 5, self.out, "--defaults", 6)):
