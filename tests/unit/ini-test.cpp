@@ -60,7 +60,8 @@ TEST_F(Ini, NoneAnswersEverything) {
     EXPECT_EQ(none.boolean("a:b", 1), 1);
     EXPECT_FALSE(none.add_section("a"));
     EXPECT_FALSE(none.set("a:b", "c"));
-    none.unset("a:b");
+    EXPECT_FALSE(none.append("a:b", "1"));
+    none.clear();
     EXPECT_THAT(none.entries(), IsEmpty());
     EXPECT_FALSE(none.dump(1));
 }
@@ -92,10 +93,9 @@ TEST_F(Ini, ListsEntriesInTheFilesOrder) {
 }
 
 TEST_F(Ini, LoadsBackWhatWasDumped) {
-    ZelSvcIni ini = loaded("[a]\nold = 1\ngone = 2\n");
+    ZelSvcIni ini = loaded("[a]\nold = 1\n");
     EXPECT_TRUE(ini.add_section("New"));
     EXPECT_TRUE(ini.set("New:Key", "\"a # b\""));
-    ini.unset("a:gone");
     {
         const ZelSvcFd file = zel_svc_file_open("/opt/t/out.ini", O_RDWR | O_CREAT | O_TRUNC, 0644);
         EXPECT_TRUE(ini.dump(file.get()));
@@ -105,7 +105,44 @@ TEST_F(Ini, LoadsBackWhatWasDumped) {
     const ZelSvcIni again = ZelSvcIni::load("/opt/t/out.ini");
     EXPECT_STREQ(again.text("a:old"), "1");
     EXPECT_STREQ(again.text("new:key"), "a # b");
-    EXPECT_FALSE(again.has("a:gone"));
+}
+
+TEST_F(Ini, WrittenAfreshHoldsWhatWasAppendedInItsOrder) {
+    ZelSvcIni ini = loaded("[a]\nold = 1\ngone = 2\n[b]\nkey = 3\n");
+    ini.clear();
+    EXPECT_FALSE(ini.has("a"));
+    EXPECT_TRUE(ini.append("Z", nullptr));
+    EXPECT_TRUE(ini.append("Z:Key", "\"a # b\""));
+    EXPECT_TRUE(ini.append("a", nullptr));
+    EXPECT_TRUE(ini.append("a:old", "4"));
+    // The library finds them, and takes more by its own ways.
+    EXPECT_STREQ(ini.text("a:old"), "4");
+    EXPECT_TRUE(ini.set("a:old", "5"));
+    EXPECT_TRUE(ini.set("a:new", "6"));
+    EXPECT_TRUE(ini.append("a:last", "7"));
+    {
+        const ZelSvcFd file = zel_svc_file_open("/opt/t/out.ini", O_RDWR | O_CREAT | O_TRUNC, 0644);
+        EXPECT_TRUE(ini.dump(file.get()));
+    }
+    const ZelSvcIni again = ZelSvcIni::load("/opt/t/out.ini");
+    std::vector<std::pair<std::string, std::string>> found;
+    for (const auto &[key, value] : again.entries())
+        found.emplace_back(key, value ? value : "(section)");
+    EXPECT_THAT(found, ElementsAre(Pair("z", "(section)"), Pair("z:key", "a # b"), Pair("a", "(section)"),
+                                   Pair("a:old", "5"), Pair("a:new", "6"), Pair("a:last", "7")));
+}
+
+TEST_F(Ini, TakesAsManyEntriesAsComeAndIsEmptiedAgain) {
+    ZelSvcIni ini = loaded("");
+    for (int round = 0; round < 2; ++round) {
+        ini.clear();
+        EXPECT_TRUE(ini.append("s", nullptr));
+        for (int i = 0; i < 5000; ++i)
+            ASSERT_TRUE(ini.append("s:k" + std::to_string(i), std::to_string(i + round).c_str()));
+        EXPECT_EQ(ini.entries().size(), 5001U);
+        EXPECT_EQ(ini.number("s:k0", -1), round);
+        EXPECT_EQ(ini.number("s:k4999", -1), 4999 + round);
+    }
 }
 
 TEST_F(Ini, TellsThatADumpFellShort) {

@@ -8,12 +8,38 @@
 #include <cstdio>
 #include <cstdlib>
 #include <fcntl.h>
+#include <utility>
 
 namespace {
 
 struct CloseStream {
     void operator()(std::FILE *stream) const { std::fclose(stream); }
 };
+
+// A column of the dictionary with twice the room; the library frees it. Null, and nothing done, without memory.
+template <class T> T *twice(T *column, std::size_t size) {
+    T *larger = static_cast<T *>(std::calloc(2 * size, sizeof(T)));
+    if (larger) std::copy_n(column, size, larger);
+    return larger;
+}
+
+bool grow(dictionary &all) {
+    const auto size = static_cast<std::size_t>(all.size);
+    char **values = twice(all.val, size);
+    char **keys = twice(all.key, size);
+    unsigned *hashes = twice(all.hash, size);
+    if (!values || !keys || !hashes) {
+        std::free(values);
+        std::free(keys);
+        std::free(hashes);
+        return false;
+    }
+    std::free(std::exchange(all.val, values));
+    std::free(std::exchange(all.key, keys));
+    std::free(std::exchange(all.hash, hashes));
+    all.size *= 2;
+    return true;
+}
 
 } // namespace
 
@@ -56,8 +82,27 @@ bool ZelSvcIni::set(const std::string &key, const std::string &value) {
     return dictionary_ && iniparser_set(dictionary_.get(), key.c_str(), value.c_str()) == 0;
 }
 
-void ZelSvcIni::unset(const std::string &key) {
-    if (dictionary_) iniparser_unset(dictionary_.get(), key.c_str());
+void ZelSvcIni::clear() {
+    if (!dictionary_) return;
+    dictionary &all = *dictionary_;
+    for (ssize_t i = 0; i < all.size; ++i) {
+        std::free(std::exchange(all.key[i], nullptr));
+        std::free(std::exchange(all.val[i], nullptr));
+    }
+    all.n = 0;
+}
+
+// The library looks for an entry among all that there are before it adds one, which a customer of many
+// networks would feel. So it is shown an empty dictionary: the free places behind the entries.
+bool ZelSvcIni::append(const std::string &key, const char *value) {
+    if (!dictionary_) return false;
+    dictionary &all = *dictionary_;
+    if ((all.n == all.size && !grow(all)) || all.key[all.n]) return false;
+    dictionary free_places{
+        .n = 0, .size = all.size - all.n, .val = all.val + all.n, .key = all.key + all.n, .hash = all.hash + all.n};
+    if (iniparser_set(&free_places, key.c_str(), value) != 0 || !free_places.key[0]) return false;
+    ++all.n;
+    return true;
 }
 
 std::vector<std::pair<std::string, const char *>> ZelSvcIni::entries() const {

@@ -35,7 +35,11 @@ class ZelSvcIni {
     // A section comes into being with add_section(); a key set without its section is lost in a dump.
     bool add_section(const std::string &section);
     bool set(const std::string &key, const std::string &value);
-    void unset(const std::string &key);
+
+    // For what is written afresh: clear() empties the dictionary, then append() adds a section (null value) or a
+    // key that it does not hold yet, without a search for it.
+    void clear();
+    bool append(const std::string &key, const char *value);
 
     // Every "section:key" with its value in the file's order; sections stand as names without a value (null).
     [[nodiscard]] std::vector<std::pair<std::string, const char *>> entries() const;

@@ -43,13 +43,13 @@ std::string loaded_as_written(std::string_view value) {
 }
 
 bool write_entry(ZelSvcIni &dictionary, const ZelSvcDataEntry &entry) {
-    if (entry.form == Form::Section) return dictionary.add_section(entry.name);
-    return dictionary.set(entry.name, entry.form == Form::Loaded ? loaded_as_written(entry.value) : entry.value);
+    if (entry.form == Form::Section) return dictionary.append(entry.name, nullptr);
+    if (entry.form != Form::Loaded) return dictionary.append(entry.name, entry.value.c_str());
+    return dictionary.append(entry.name, loaded_as_written(entry.value).c_str());
 }
 
 bool update_dictionary(ZelSvcDataGroupState &group) {
-    for (const auto &[name, value] : group.dictionary.entries())
-        if (!group.entries.find(name)) group.dictionary.unset(name);
+    group.dictionary.clear();
     return std::all_of(group.entries.begin(), group.entries.end(),
                        [&group](const ZelSvcDataEntry &entry) { return write_entry(group.dictionary, entry); });
 }
