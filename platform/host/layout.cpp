@@ -1,6 +1,7 @@
 #include "layout.h"
 
 #include "modem.h"
+#include "system-information.h"
 #include "tools.h"
 
 #include <fcntl.h>
@@ -20,7 +21,9 @@ CREATE TABLE fault (id INTEGER PRIMARY KEY AUTOINCREMENT, function TEXT NOT NULL
                     error INTEGER NOT NULL, seen INTEGER NOT NULL DEFAULT 0);
 CREATE TABLE journal (id INTEGER PRIMARY KEY, function TEXT NOT NULL, arguments TEXT NOT NULL);
 CREATE TABLE tool (path TEXT PRIMARY KEY, status INTEGER NOT NULL, file TEXT NOT NULL,
-                   content TEXT NOT NULL) WITHOUT ROWID;
+                   content TEXT NOT NULL, does TEXT NOT NULL) WITHOUT ROWID;
+CREATE TABLE application (name TEXT PRIMARY KEY, type TEXT NOT NULL, state TEXT NOT NULL,
+                          refusal TEXT NOT NULL) WITHOUT ROWID;
 CREATE TABLE modem (slot INTEGER PRIMARY KEY, name TEXT NOT NULL, state INTEGER NOT NULL, mcc TEXT, mnc TEXT,
                     msin TEXT, gid TEXT, spn TEXT, result INTEGER);
 CREATE TABLE bookmark (id INTEGER PRIMARY KEY, parent INTEGER NOT NULL, folder INTEGER NOT NULL,
@@ -82,12 +85,12 @@ constexpr const char *kNetworkDatabases[] = {"/opt/dbspace/.dnet.db", "/opt/dbsp
 
 struct PlatformTool {
     const char *path;
-    const char *file;
+    const char *does;
 };
 constexpr PlatformTool kTools[] = {
-    {"/usr/bin/pkgcmd", "-p"}, // writes the result list that its option -p names
-    {"/usr/bin/pkg", ""},
-    {"/usr/bin/rpm-backend", ""},
+    {"/usr/bin/pkgcmd", "install-list"},
+    {"/usr/bin/pkg", "disable"},
+    {"/usr/bin/rpm-backend", "uninstall"},
 };
 
 void make_folder(Phone &phone, std::string_view path) {
@@ -124,7 +127,9 @@ void make_platform(Phone &phone) {
     for (const char *path : kNetworkDatabases)
         make_network_database(phone, path);
     for (const PlatformTool &tool : kTools)
-        add_tool(phone, {.path = tool.path, .exit_status = 0, .file = tool.file, .content = {}});
+        add_tool(phone, {.path = tool.path, .does = tool.does});
+    for (const InformationRow &row : kInformation)
+        set_information(phone, row, row.at_first);
 }
 
 } // namespace zel_host

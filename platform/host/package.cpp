@@ -57,7 +57,8 @@ bool take_away(Phone &phone) {
 }
 
 void forget(Phone &phone) {
-    phone.store().execute("DELETE FROM vconf; DELETE FROM attribute; DELETE FROM journal; DELETE FROM tool;"
+    phone.store().execute("DELETE FROM vconf; DELETE FROM attribute; DELETE FROM journal; DELETE FROM tool; "
+                          "DELETE FROM application; "
                           "DELETE FROM record WHERE name <> 'slots'");
     clear_bookmarks(phone);
     clear_sync_accounts(phone);

@@ -2,19 +2,16 @@
 
 #include "content.h"
 #include "open-file.h"
+#include "tool-behaviour.h"
 
-#include <algorithm>
 #include <fcntl.h>
 #include <optional>
-#include <vector>
 
 namespace zel_host {
 namespace {
 
 constexpr const char *kBlanks = " \t\n";
 constexpr mode_t kFileMode = 0644;
-
-using Words = std::vector<std::string_view>;
 
 Words words_of(std::string_view command) {
     Words words;
@@ -31,19 +28,19 @@ Tool read(const Query &query) {
     return {.path = query.text(0),
             .exit_status = static_cast<int>(query.integer(1)),
             .file = query.text(2),
-            .content = query.text(3)};
+            .content = query.text(3),
+            .does = query.text(4)};
 }
 
 std::optional<Tool> find_tool(Phone &phone, std::string_view path) {
-    Query query = phone.store().query("SELECT path, status, file, content FROM tool WHERE path = ?");
+    Query query = phone.store().query("SELECT path, status, file, content, does FROM tool WHERE path = ?");
     return query.bind(path).row() ? std::optional<Tool>(read(query)) : std::nullopt;
 }
 
 // The file that this call of the tool writes; "" for none.
 std::string_view file_of(const Tool &tool, const Words &words) {
     if (tool.file.empty() || tool.file.front() == '/') return tool.file;
-    const auto option = std::find(words.begin(), words.end(), tool.file);
-    return words.end() - option < 2 ? std::string_view() : *(option + 1);
+    return word_after(words, tool.file);
 }
 
 void write_file(Phone &phone, const Tool &tool, const Words &words) {
@@ -60,12 +57,16 @@ int run_command(Phone &phone, std::string_view command) {
     const std::optional<Tool> tool = words.empty() ? std::nullopt : find_tool(phone, words.front());
     if (!tool) return kNotFound;
     write_file(phone, *tool, words);
-    return tool->exit_status << 8;
+    const Behaviour *behaviour = find_behaviour(tool->does);
+    // A tool that was told to fail has done nothing.
+    const bool acts = behaviour != nullptr && tool->exit_status == 0;
+    return (acts ? behaviour->run(phone, words) : tool->exit_status) << 8;
 }
 
 void add_tool(Phone &phone, const Tool &tool) {
-    Query query = phone.store().query("INSERT OR REPLACE INTO tool (path, status, file, content) VALUES (?, ?, ?, ?)");
-    query.bind(tool.path).bind(tool.exit_status).bind(tool.file).bind(tool.content).run();
+    Query query =
+        phone.store().query("INSERT OR REPLACE INTO tool (path, status, file, content, does) VALUES (?, ?, ?, ?, ?)");
+    query.bind(tool.path).bind(tool.exit_status).bind(tool.file).bind(tool.content).bind(tool.does).run();
 }
 
 bool remove_tool(Phone &phone, std::string_view path) {
@@ -76,7 +77,7 @@ bool remove_tool(Phone &phone, std::string_view path) {
 }
 
 void each_tool(Phone &phone, const std::function<void(const Tool &tool)> &use) {
-    Query query = phone.store().query("SELECT path, status, file, content FROM tool ORDER BY path");
+    Query query = phone.store().query("SELECT path, status, file, content, does FROM tool ORDER BY path");
     while (query.row())
         use(read(query));
 }

@@ -17,6 +17,7 @@ struct Tool {
     int exit_status = 0; // 0 to 255
     std::string file;    // what it writes: a phone path, or an option ("-p") whose next word is the path; or ""
     std::string content; // of that file
+    std::string does;    // what else it does on the phone, a row of tool-behaviour.cpp; or ""
 };
 
 // Raw wait status.

@@ -54,9 +54,9 @@ constexpr Verb kOwnVerbs[] = {
 } // namespace
 
 std::span<const std::span<const Verb>> all_verbs() {
-    static const std::span<const Verb> groups[] = {phone_verbs(),   file_verbs(),  key_verbs(),  clock_verbs(),
-                                                   log_verbs(),     fault_verbs(), tool_verbs(), sim_verbs(),
-                                                   service_verbs(), kOwnVerbs};
+    static const std::span<const Verb> groups[] = {phone_verbs(),   file_verbs(),        key_verbs(),  clock_verbs(),
+                                                   log_verbs(),     fault_verbs(),       tool_verbs(), sim_verbs(),
+                                                   service_verbs(), application_verbs(), kOwnVerbs};
     return groups;
 }
 

@@ -48,6 +48,7 @@ std::span<const Verb> fault_verbs();
 std::span<const Verb> tool_verbs();
 std::span<const Verb> sim_verbs();
 std::span<const Verb> service_verbs();
+std::span<const Verb> application_verbs();
 std::span<const std::span<const Verb>> all_verbs();
 
 const Verb *find_verb(std::string_view name);

@@ -46,7 +46,8 @@ Json status(Phone &phone, const Json & /*arguments*/) {
                 {"faults", any_faults(phone)},
                 {"journal", phone.page().journal_on.load() != 0}};
     put_text(result, "root", phone.path());
-    put_text(result, "theme_picture", recorded_text(phone, "theme_picture"));
+    for (const char *name : {"theme_picture", "initial_keyboard", "active_keyboard", "time_zone"})
+        put_text(result, name, recorded_text(phone, name));
     for (const Modem &modem : modems(phone))
         result["sim_states"].push_back(modem.state);
     return result;

@@ -1,4 +1,5 @@
 #include "text.h"
+#include "tool-behaviour.h"
 #include "tools.h"
 #include "verb.h"
 
@@ -12,6 +13,7 @@ Json shown(const Tool &tool) {
     put_text(result, "path", tool.path);
     put_text(result, "file", tool.file);
     put_text(result, "content", tool.content);
+    put_text(result, "does", tool.does);
     return result;
 }
 
@@ -21,8 +23,11 @@ Json add(Phone &phone, const Json &arguments) {
     const Tool tool{.path = text_of(arguments, "path"),
                     .exit_status = static_cast<int>(status),
                     .file = text_of(arguments, "file"),
-                    .content = text_of(arguments, "content")};
+                    .content = text_of(arguments, "content"),
+                    .does = text_of(arguments, "does")};
     if (tool.path.empty()) throw WrongArguments("a tool has a path");
+    if (!tool.does.empty() && find_behaviour(tool.does) == nullptr)
+        throw WrongArguments("no tool does '" + tool.does + "'");
     add_tool(phone, tool);
     return shown(tool);
 }
@@ -45,6 +50,7 @@ constexpr Argument kAddArguments[] = {
     {.name = "status", .type = ArgumentType::Integer, .help = "Its exit status, 0 without it"},
     {.name = "file", .help = "Phone path that it writes, or the option before that path"},
     {.name = "content", .help = "What it writes there"},
+    {.name = "does", .help = "What else it does: install-list, disable or uninstall"},
 };
 constexpr Argument kRemoveArguments[] = {{.name = "path", .required = true, .help = "Path of the tool"}};
 

@@ -102,7 +102,8 @@ TEST_F(Package, ProgramsInItAreNeverRun) {
     const std::string script = "#!/bin/sh\ntouch " + mark + "\n";
     write("/usr/bin/pkgcmd", script, 0755);
     write("/usr/bin/other", script, 0755);
-    EXPECT_EQ(zel_platform_command("/usr/bin/pkgcmd -S a -p /opt/result"), 0);
+    write("/opt/list", "[zel packages]\nname_001 = com.example.notes\n");
+    EXPECT_EQ(zel_platform_command("/usr/bin/pkgcmd -S /opt/list -p /opt/result"), 0);
     EXPECT_EQ(zel_platform_command("/usr/bin/other"), 32512);
     EXPECT_EQ(zel_platform_command("touch "), 32512);
     EXPECT_EQ(zel_platform_command("/bin/sh -c true"), 32512);

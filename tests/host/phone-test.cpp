@@ -201,8 +201,6 @@ TEST_F(Phone, DisplayAndThemeAreRecorded) {
 }
 
 TEST_F(Phone, ToolsAnswerCommands) {
-    EXPECT_EQ(zel_platform_command("/usr/bin/pkgcmd -S /a -p /opt/system/zel-default/app/result.ini"), 0);
-    EXPECT_TRUE(exists("/opt/system/zel-default/app/result.ini"));
     call("tool-add", {{"path", "/usr/bin/pkg"}, {"status", 3}, {"file", "/opt/written"}, {"content", "yes"}});
     EXPECT_EQ(zel_platform_command("  /usr/bin/pkg\t-d x"), 3 << 8);
     EXPECT_EQ(read("/opt/written"), "yes");

@@ -12,9 +12,9 @@ namespace zel_command {
 namespace {
 
 // Verbs that only look: they run beside a command that changes the phone. Any other takes the phone's lock.
-constexpr std::array<std::string_view, 11> kLookingVerbs{"status",    "stat",      "tree",         "read",
-                                                         "log",       "vconf-get", "vconf-list",   "fault-list",
-                                                         "tool-list", "bookmarks", "sync-accounts"};
+constexpr std::array<std::string_view, 13> kLookingVerbs{
+    "app-list",  "system",     "status",     "stat",      "tree",      "read",         "log",
+    "vconf-get", "vconf-list", "fault-list", "tool-list", "bookmarks", "sync-accounts"};
 
 Access access_of(const std::string &verb, bool needs_phone) {
     if (!needs_phone) return Access::kNone;

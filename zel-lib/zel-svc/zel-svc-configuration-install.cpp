@@ -22,6 +22,8 @@
 #include "base/zel-svc-log.h"
 #include "base/zel-svc-run-log.h"
 #include "base/zel-svc-text.h"
+#include "preset/zel-svc-fs-update.h"
+#include "preset/zel-svc-preset.h"
 #include "zel-svc-configuration-phase.h"
 #include "zel-svc-configuration-phases.h"
 
@@ -68,9 +70,12 @@ void clear_sim_auto_setting() {
 }
 
 void install_preconfiguration(std::string_view customer, bool full) {
-    zel_svc_phase(full ? "Install ZEL Preset" : "Upgrade ZEL Preset", ZEL_TIME_LAP_PRESET, [] {});
+    const int kind = full ? ZEL_SVC_INSTALL_CONFIG_MODE : ZEL_SVC_INSTALL_FOTA_MODE;
+    zel_svc_phase(full ? "Install ZEL Preset" : "Upgrade ZEL Preset", ZEL_TIME_LAP_PRESET,
+                  [=] { zel_svc_preset_install(customer, kind); });
     zel_svc_config_copy_user_folder(customer);
-    zel_svc_phase(full ? "Install ZEL FS" : "Upgrade ZEL FS", ZEL_TIME_LAP_FS_UPDATE, [] {});
+    zel_svc_phase(full ? "Install ZEL FS" : "Upgrade ZEL FS", ZEL_TIME_LAP_FS_UPDATE,
+                  [=] { zel_svc_fs_update(customer, kind); });
     zel_svc_config_set_power_animation(customer);
 }
 
