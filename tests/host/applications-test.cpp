@@ -16,7 +16,8 @@ constexpr const char *kInstall = "/usr/bin/pkgcmd -S /opt/list.ini -p /opt/resul
 
 struct Applications : zel_test::BenchPhone {
     json application(const std::string &name) {
-        for (const json &one : call("app-list").at("applications"))
+        const json list = call("app-list"); // the loop needs it to the end
+        for (const json &one : list.at("applications"))
             if (one.at("name") == name) return one;
         return nullptr;
     }

@@ -242,7 +242,7 @@ TEST_F(Phone, VerbsDescribeThemselves) {
                      "vconf-get",    "vconf-set",    "vconf-unset",   "vconf-list", "log",         "clock",
                      "reboot",       "reset",        "fault-add",     "fault-list", "fault-clear", "journal-start",
                      "journal-stop", "journal-list", "journal-clear", "tool-add",   "tool-list",   "tool-remove",
-                     "lock",         "verbs"}));
+                     "app-list",     "app-refuse",   "system",        "system-set", "lock",        "verbs"}));
 }
 
 TEST_F(Phone, WrongArgumentsAreRefused) {

@@ -17,11 +17,11 @@ struct Preset : zel_test::FilesPhone {
         const std::vector<std::string> log = system_log();
         return std::any_of(log.begin(), log.end(), [&](const std::string &line) { return line.ends_with(text); });
     }
-    // The merged file without the blanks in which the INI library lays it out.
+    // The merged file without the blanks and empty lines in which the INI library lays it out.
     std::string merged() {
         std::string text;
         for (const char c : read(kMerged))
-            if (c != ' ') text += c;
+            if (c != ' ' && !(c == '\n' && (text.empty() || text.back() == '\n'))) text += c;
         return text;
     }
 };
@@ -157,7 +157,7 @@ TEST_F(Preset, TheCustomersFileOverridesTheDefaultsRowByRow) {
     zel_svc_preset_install("XFV", 0);
     EXPECT_EQ(get_string("db/zel/font_default_style"), "Default");
     EXPECT_EQ(get_string("db/isf/input_language"), "hi_IN");
-    EXPECT_EQ(merged(), "[default]\nkeyboard_lang=\"hi_IN\"\nfont_style=\"Default\"\n\n\n");
+    EXPECT_EQ(merged(), "[default]\nkeyboard_lang=\"hi_IN\"\nfont_style=\"Default\"\n");
 }
 
 TEST_F(Preset, TheUserAgentIsTheCustomersWhereTheDefaultsHaveNone) {
@@ -172,7 +172,7 @@ TEST_F(Preset, AnEmptyStringIsStoredAndSet) {
     set_string("db/browser/user_agent", "before");
     write_presets("XFV", "[default]\nfont_style = \"\"\nua = \"\"\n");
     zel_svc_preset_install("XFV", 0);
-    EXPECT_EQ(merged(), "[default]\nua=\nfont_style=\n\n\n");
+    EXPECT_EQ(merged(), "[default]\nua=\nfont_style=\n");
     EXPECT_EQ(get_string("db/zel/font_default_style"), "");
     EXPECT_EQ(get_string("db/browser/user_agent"), "");
 }
@@ -201,7 +201,7 @@ TEST_F(Preset, AStringIsSetAsItStoodWhateverItHolds) {
 TEST_F(Preset, UnknownKeysAndOtherSectionsAreNotMerged) {
     write_presets("XFV", "[default]\nunknown = 1\nfont_style = \"a\"\n[other]\nkeyboard_lang = \"x\"\n");
     zel_svc_preset_install("XFV", 0);
-    EXPECT_EQ(merged(), "[default]\nfont_style=\"a\"\n\n\n");
+    EXPECT_EQ(merged(), "[default]\nfont_style=\"a\"\n");
     EXPECT_EQ(get_string("db/isf/input_language"), std::nullopt);
 }
 
@@ -212,7 +212,7 @@ TEST_F(Preset, AnUpgradeAppliesWhatIsMarked) {
     EXPECT_EQ(get_string("db/zel/font_default_style"), "a");
     EXPECT_EQ(get_string("db/isf/input_language"), std::nullopt);
     EXPECT_EQ(get_string("db/velaro/package_name"), std::nullopt);
-    EXPECT_EQ(merged(), "[default]\nkeyboard_lang=\"b\"\nvelaro_pkg_name=\"c\"\nfont_style=\"a\"\n\n\n");
+    EXPECT_EQ(merged(), "[default]\nkeyboard_lang=\"b\"\nvelaro_pkg_name=\"c\"\nfont_style=\"a\"\n");
 }
 
 TEST_F(Preset, InAnUpgradeTheLaterFileDecides) {
@@ -240,7 +240,7 @@ TEST_F(Preset, AMarkCountsOnlyAsOne) {
 TEST_F(Preset, TheMergedFileIsMadeAfreshWithItsAttributes) {
     write(kMerged, "[default]\nfont_style = \"old\"\n", 0600);
     zel_svc_preset_install("XFV", 0);
-    EXPECT_EQ(merged(), "[default]\n\n\n");
+    EXPECT_EQ(merged(), "[default]\n");
     EXPECT_EQ(attributes(kMerged), (zel_test::Attributes{0644, 200, 5000, "zel-manager"}));
     EXPECT_EQ(get_string("db/zel/font_default_style"), std::nullopt);
 }

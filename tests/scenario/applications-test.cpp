@@ -1,0 +1,226 @@
+// Applications: the lists that the package tool installs, and what becomes of the operator applications.
+
+#include "service-phone.h"
+
+#include <gmock/gmock.h>
+
+namespace {
+
+using ::testing::ElementsAre;
+using ::testing::IsEmpty;
+
+constexpr const char *kAppFolder = "/opt/system/zel-default/app";
+
+class Apps : public zel_test::ServicePhone {
+  protected:
+    void write_list(const std::string &package, const std::string &name, const std::string &application) {
+        write("/opt/system/zel/preconfig/" + package + "/app/" + name,
+              "[zel packages]\nname_001 = " + application + "\ntype_001 = tpk\n");
+    }
+    // The commands that the phone was asked to run, in order.
+    std::vector<std::string> commands() {
+        const nlohmann::json journal = call("journal-list");
+        std::vector<std::string> found;
+        for (const auto &entry : journal.at("calls"))
+            if (entry.at("function") == "zel_platform_command") found.push_back(entry.at("text"));
+        return found;
+    }
+    std::vector<std::string> lines_with(const std::string &word) {
+        std::vector<std::string> found;
+        for (const std::string &line : run_log_lines())
+            if (line.find(word) != std::string::npos) found.push_back(line);
+        return found;
+    }
+};
+
+TEST_F(Apps, BothListsAreInstalled) {
+    write_list("DEF", "applist_def.ini", "com.example.notes");
+    write_list("BTU", "applist.ini", "com.example.map");
+    write(std::string{kAppFolder} + "/old/file", "old");
+    call("journal-start");
+    zel_svc_config_install_customer("BTU", ZEL_SVC_INSTALL_CONFIG_MODE);
+    EXPECT_THAT(commands(), ElementsAre("/usr/bin/pkgcmd -S /opt/system/zel-default/app/applist_def.ini -p "
+                                        "/opt/system/zel-default/app/appresult_def.ini",
+                                        "/usr/bin/pkgcmd -S /opt/system/zel-default/app/applist.ini -p "
+                                        "/opt/system/zel-default/app/appresult.ini"));
+    EXPECT_THAT(lines_with("App"),
+                ElementsAre("[Config/Start] Install default App.", "[Config/Ended] Install default App.",
+                            "[Config/Start] Install customer App.", "[Config/Ended] Install customer App.",
+                            "[Config] No need to disable App as default."));
+    EXPECT_FALSE(exists(std::string{kAppFolder} + "/old"));
+    EXPECT_NE(read(std::string{kAppFolder} + "/appresult_def.ini").find("success"), std::string::npos);
+    EXPECT_NE(read(std::string{kAppFolder} + "/appresult.ini").find("com.example.map"), std::string::npos);
+    EXPECT_EQ(call("app-list").at("applications").size(), 2U);
+}
+
+TEST_F(Apps, WithoutListsNothingIsInstalled) {
+    write(std::string{kAppFolder} + "/applist.ini", "of an earlier install");
+    call("journal-start");
+    zel_svc_config_install_customer("BTU", ZEL_SVC_INSTALL_NORMAL_BOOTING);
+    EXPECT_THAT(commands(), IsEmpty());
+    EXPECT_TRUE(logged_in_order({"[Config] Default applist not existed.", "[Config] Customer applist not existed."}));
+    EXPECT_TRUE(exists(kAppFolder));
+    EXPECT_FALSE(exists(std::string{kAppFolder} + "/applist.ini"));
+    EXPECT_EQ(laps().at(4), "App");
+}
+
+TEST_F(Apps, AFailedToolIsIgnored) {
+    write_list("DEF", "applist_def.ini", "com.example.notes");
+    write_list("BTU", "applist.ini", "com.example.map");
+    call("tool-remove", {{"path", "/usr/bin/pkgcmd"}});
+    zel_svc_config_install_customer("BTU", ZEL_SVC_INSTALL_CONFIG_MODE);
+    EXPECT_TRUE(logged_in_order({"[Config/Ended] Install default App.", "[Config/Ended] Install customer App."}));
+    EXPECT_FALSE(exists(std::string{kAppFolder} + "/appresult_def.ini"));
+}
+
+TEST_F(Apps, AFotaUpgradeTouchesNone) {
+    write_list("DEF", "applist_def.ini", "com.example.notes");
+    write(std::string{kAppFolder} + "/kept", "kept");
+    zel_svc_config_install_customer("INS", ZEL_SVC_INSTALL_FOTA_MODE);
+    EXPECT_THAT(lines_with("App"), IsEmpty());
+    EXPECT_EQ(read(std::string{kAppFolder} + "/kept"), "kept");
+}
+
+TEST_F(Apps, OtherCustomersHaveNoOperatorApps) {
+    write("/opt/usr/apps/com.skatamfa.beats/bin/jiobeats", "app");
+    write("/opt/usr/apps/com.skatamfa.apptray/bin/jioapps", "app");
+    zel_svc_config_install_customer("BTU", ZEL_SVC_INSTALL_NORMAL_BOOTING);
+    EXPECT_TRUE(logged_in_order({"[Config] No need to check App existence.", "[Config] Default applist not existed.",
+                                 "[Config] No need to disable App as default.",
+                                 "[Config] No need to remove App manually(FOTA)."}));
+    EXPECT_TRUE(call("app-list").at("applications").empty());
+    EXPECT_TRUE(exists("/opt/usr/apps/com.skatamfa.apptray/bin/jioapps"));
+}
+
+struct OperatorApp {
+    const char *name;
+    const char *package;
+    const char *executable;
+};
+
+constexpr OperatorApp kApps[] = {
+    {"SkatamfaBeats", "com.skatamfa.beats", "/opt/usr/apps/com.skatamfa.beats/bin/jiobeats"},
+    {"SkatamfaOnDemand", "com.skatamfa.ondemand", "/opt/usr/apps/com.skatamfa.ondemand/bin/jioondemand"},
+    {"SkatamfaXPressNews", "ZFQ9uYrIPH", "/opt/usr/apps/ZFQ9uYrIPH/bin/ZFQ9uYrIPH.SkatamfaNews"},
+    {"MySkatamfa", "AOzuftR6Ou", "/opt/usr/apps/AOzuftR6Ou/bin/AOzuftR6Ou.MySkatamfa"},
+};
+
+// Which of the four are there before the upgrade, bit by bit. The package tool's result file stands for an
+// application that the upgrade brings: the tool writes it where the application's executable lies.
+class OperatorApps : public Apps {
+  protected:
+    void prepare(unsigned before) {
+        for (unsigned i = 0; i < 4; ++i)
+            if ((before >> i & 1U) != 0) write(kApps[i].executable, "old");
+    }
+    // What a normal start is expected to log, and the commands that it is expected to give.
+    static std::vector<std::string> expected_lines(unsigned before, unsigned after) {
+        std::vector<std::string> lines{"[Config/Start] Check App existence before App upgrade (FOTA)."};
+        for (unsigned i = 0; i < 4; ++i)
+            lines.push_back(std::string{"[Config] "} + kApps[i].name + " App " +
+                            ((before >> i & 1U) != 0 ? "already existed" : "NOT existed") + " before App upgrade.");
+        for (const char *line :
+             {"[Config/End] Check App existence before App upgrade (FOTA).", "[Config/Start] Install default App.",
+              "[Config/Ended] Install default App.", "[Config/Start] Disable App as default."})
+            lines.emplace_back(line);
+        for (unsigned i = 0; i < 4; ++i) {
+            const std::string app = std::string{"[Config] "} + kApps[i].name + " App ";
+            if ((before >> i & 1U) != 0) {
+                lines.push_back(app + "is NOT NEW, skip.");
+            } else if ((after >> i & 1U) != 0) {
+                lines.push_back(app + "normally existed.");
+                lines.push_back(app + "is disabled(result=0).");
+            } else {
+                lines.push_back(app + "NOT existed.");
+            }
+        }
+        for (const char *line : {"[Config/Ended] Disable App as default.", "[Config/Start] Remove App manually(FOTA).",
+                                 "[Config] SkatamfaApps App NOT existed.", "[Config/Ended] Remove App manually(FOTA)."})
+            lines.emplace_back(line);
+        return lines;
+    }
+    void write_default_list() { write_list("DEF", "applist_def.ini", "com.example.notes"); }
+};
+
+// One application comes or goes with the upgrade; the other three were there or not throughout.
+struct OneChanges : OperatorApps, ::testing::WithParamInterface<unsigned> {};
+
+TEST_P(OneChanges, WithAnyOfTheOthersThere) {
+    const unsigned changing = GetParam();
+    write_default_list();
+    const unsigned others = 15U & ~(1U << changing);
+    for (const unsigned before : {0U, others})
+        for (const bool comes : {false, true}) {
+            call("reset");
+            prepare(before);
+            if (comes)
+                call("tool-add",
+                     {{"path", "/usr/bin/pkgcmd"}, {"file", kApps[changing].executable}, {"content", "new"}});
+            if (comes) write(std::string{kApps[changing].executable} + ".parent", "");
+            zel_svc_config_install_customer("INS", ZEL_SVC_INSTALL_NORMAL_BOOTING);
+            const unsigned after = before | (comes ? 1U << changing : 0U);
+            EXPECT_TRUE(logged_in_order(expected_lines(before, after))) << before << ' ' << after;
+            const nlohmann::json list = call("app-list");
+            const std::string handled = comes ? kApps[changing].package : "com.example.notes";
+            for (const auto &one : list.at("applications"))
+                EXPECT_EQ(one.at("name"), handled);
+            EXPECT_EQ(lines_with("is disabled").size(), comes ? 1U : 0U);
+        }
+}
+
+INSTANTIATE_TEST_SUITE_P(Index, OneChanges, ::testing::Range(0U, 4U));
+
+// A full install knows of no time before: whatever is there is disabled.
+TEST_F(OperatorApps, AFullInstallDisablesWhateverIsThere) {
+    for (unsigned there = 0; there < 16; ++there) {
+        call("reset");
+        prepare(there);
+        call("journal-start");
+        zel_svc_config_install_customer("INS", ZEL_SVC_INSTALL_CONFIG_MODE);
+        std::vector<std::string> expected;
+        for (unsigned i = 0; i < 4; ++i)
+            if ((there >> i & 1U) != 0) expected.push_back(std::string{"/usr/bin/pkg -d "} + kApps[i].package);
+        EXPECT_EQ(commands(), expected) << there;
+        EXPECT_TRUE(lines_with("App existence").empty());
+        EXPECT_TRUE(lines_with("manually").empty());
+    }
+}
+
+TEST_F(OperatorApps, ARefusedDisableShowsItsStatus) {
+    prepare(0b1001);
+    call("app-refuse", {{"name", "com.skatamfa.beats"}, {"answer", "fail"}});
+    zel_svc_config_install_customer("INS", ZEL_SVC_INSTALL_CONFIG_MODE);
+    EXPECT_TRUE(
+        logged_in_order({"[Config] SkatamfaBeats App is disabled(result=256).",
+                         "[Config] MySkatamfa App is disabled(result=0).", "[Config/Ended] Disable App as default."}));
+}
+
+TEST_F(OperatorApps, WithoutTheToolTheShellsStatusIsShown) {
+    prepare(0b0100);
+    call("tool-remove", {{"path", "/usr/bin/pkg"}});
+    zel_svc_config_install_customer("INS", ZEL_SVC_INSTALL_CONFIG_MODE);
+    EXPECT_TRUE(logged("[Config] SkatamfaXPressNews App is disabled(result=32512)."));
+}
+
+TEST_F(OperatorApps, TheTrayIsRemovedOnTheFirstNormalStart) {
+    write("/opt/usr/apps/com.skatamfa.apptray/bin/jioapps", "app");
+    call("journal-start");
+    zel_svc_config_install_customer("INS", ZEL_SVC_INSTALL_NORMAL_BOOTING);
+    EXPECT_TRUE(logged_in_order({"[Config/Start] Remove App manually(FOTA).", "[Config] SkatamfaApps App existed.",
+                                 "[Config] SkatamfaApps App is removed(result=0).",
+                                 "[Config/Ended] Remove App manually(FOTA)."}));
+    EXPECT_THAT(commands(),
+                ElementsAre("/usr/bin/rpm-backend -c path=com.skatamfa.apptray:op=uninstall:removable=true"));
+    EXPECT_FALSE(exists("/opt/usr/apps/com.skatamfa.apptray"));
+}
+
+TEST_F(OperatorApps, ARefusedRemovalShowsItsStatus) {
+    write("/opt/usr/apps/com.skatamfa.apptray/bin/jioapps", "app");
+    call("tool-add", {{"path", "/usr/bin/rpm-backend"}, {"status", 9}, {"does", "uninstall"}});
+    zel_svc_config_install_customer("INS", ZEL_SVC_INSTALL_NORMAL_BOOTING);
+    EXPECT_TRUE(logged_in_order(
+        {"[Config] SkatamfaApps App is removed(result=2304).", "[Config/Ended] Remove App manually(FOTA)."}));
+    EXPECT_TRUE(exists("/opt/usr/apps/com.skatamfa.apptray/bin/jioapps"));
+}
+
+} // namespace
