@@ -1,6 +1,7 @@
 #pragma once
 // SIM cards and slots, as the commands of SIM auto setting show and name them.
 
+#include "field-text.h"
 #include "invocation.h"
 
 #include <zel-svc.h>
@@ -25,11 +26,5 @@ ZelSvcSimInfo described_card(const Invocation &invocation);
 // "21405, MSIN 987***, GID A3, SPN Orange"; what the card lacks is left out.
 std::string card_text(const ZelSvcSimInfo &card, bool reveal);
 Json card_json(const ZelSvcSimInfo &card, bool reveal);
-
-// A field of a record of the library.
-template <std::size_t N> std::string field_text(const char (&field)[N]) {
-    const std::string_view bytes{field, N};
-    return std::string{bytes.substr(0, bytes.find('\0'))};
-}
 
 } // namespace zel_command

@@ -1,6 +1,6 @@
 #include "sim-matrix.h"
 
-#include "sim-cards.h"
+#include "field-text.h"
 
 #include <base/zel-svc-text.h>
 #include <zel-svc-sim-auto-setting-match.h>
@@ -71,7 +71,6 @@ std::string Matrix::why_no_sim(std::size_t number) const {
         return "no SIM has the MCC+MNC '" + mccmnc + "': it is not five or six digits";
     const std::string subset = field_text(entry.subset_code);
     if (!is_digits(subset)) return "no MSIN begins with '" + subset + "': it is not digits";
-    if (mccmnc.size() + subset.size() > kImsiDigits) return "no MSIN is as long as '" + subset + "'";
     return {};
 }
 
