@@ -13,6 +13,12 @@ std::vector<Parameter> card_options() {
             option("gid", "TEXT", "its group identifier"), option("spn", "TEXT", "its service provider name")};
 }
 
+Parameter number_option() {
+    Parameter result = option("number", "N", "its number in 'zel sim operators', in place of a name");
+    result.integer = true;
+    return result;
+}
+
 std::vector<Parameter> operator+(std::vector<Parameter> first, const std::vector<Parameter> &others) {
     first.insert(first.end(), others.begin(), others.end());
     return first;
@@ -69,8 +75,7 @@ std::vector<Command> sim_commands() {
          .run = sim_matrix},
         {.name = "sim install",
          .parameters = {optional_positional("NETWORK", "the operator's name; of several the SIM's MCC+MNC decides"),
-                        option("number", "N", "its number in 'zel sim operators', in place of a name"),
-                        flag("all", "choose from every customer of the package"), slot_option()},
+                        number_option(), flag("all", "choose from every customer of the package"), slot_option()},
          .help = "Install an operator for a slot, as after a user's choice.",
          .more = "Makes it the slot's active operator, keeps the SIM's identity, and clears the question to the user.",
          .access = Access::kWrites,

@@ -149,7 +149,8 @@ void print_unreached(const Page &page) {
 }
 
 void print_page(const Page &page) {
-    print_line(page.operators.customer + ", " + std::to_string(page.reached.size()) + " entries");
+    print_line(page.operators.customer + ", " + std::to_string(page.reached.size()) +
+               (page.reached.size() == 1 ? " entry" : " entries"));
     print_entries(page);
     print_questions(page);
     print_unreached(page);

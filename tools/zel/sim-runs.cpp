@@ -12,6 +12,7 @@
 #include <vconf.h>
 
 #include <algorithm>
+#include <cstdlib>
 #include <sstream>
 
 namespace zel_command {
@@ -102,7 +103,7 @@ std::vector<ZelSvcSimOperator> installable(const Invocation &invocation) {
 }
 
 std::size_t numbered(const Invocation &invocation, std::size_t count) {
-    const long long number = std::stoll(invocation.value("number"));
+    const long long number = std::strtoll(invocation.value("number").c_str(), nullptr, 10); // checked to be digits
     if (number >= 1 && static_cast<unsigned long long>(number) <= count) return static_cast<std::size_t>(number - 1);
     throw Failure{kUsage, "--number is 1 to " + std::to_string(count), "'zel sim operators' lists the numbers."};
 }
