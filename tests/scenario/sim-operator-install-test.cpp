@@ -6,6 +6,7 @@
 #include <algorithm>
 #include <cstring>
 #include <gmock/gmock.h>
+#include <map>
 
 namespace {
 
@@ -111,6 +112,41 @@ class OperatorInstall : public zel_test::TwoSimPhone {
         std::sort(files.begin(), files.end());
         return files;
     }
+    // Rows that another network has in every table of both databases.
+    void fill_databases() {
+        for (const char *database : {kDatabase, kDatabase2}) {
+            const SqliteFile file{root() + database};
+            file.run("insert into network_info(network_info_id, network_name, mccmnc) values(40, 'Old', '26209')");
+            file.run("insert into fast_dormancy(dormant_id, network_info_id, lcd_on_timeout) values(0, 40, 9)");
+            file.run("insert into max_pdp(max_id, network_info_id, max_pdp_3g) values(1, 40, 9)");
+            file.run("insert into pdp_profile(profile_id, network_info_id) values(1, 40)");
+        }
+    }
+    // Everything that an install may change, by name.
+    std::map<std::string, std::string> state() {
+        std::map<std::string, std::string> all;
+        for (const std::string &file : kEveryFile)
+            all[file] = read(data_path(file));
+        for (const auto &[sim, database] : {std::pair{"", kDatabase}, {"2/", kDatabase2}})
+            for (const char *table : {"network_info", "fast_dormancy", "max_pdp", "pdp_profile"})
+                all[std::string{sim} + table] =
+                    nlohmann::json(rows(database, std::string{"select * from "} + table)).dump();
+        const nlohmann::json keys = call("vconf-list");
+        for (const nlohmann::json &key : keys.at("keys"))
+            all[key.at("key").get<std::string>()] = key.at("value").dump();
+        return all;
+    }
+    // The names of what an install changed.
+    std::vector<std::string> changed_by_install(int slot) {
+        mark_every_file();
+        set_int("db/zel/network/wb_amr_codec", 5);
+        std::map<std::string, std::string> before = state();
+        install(slot);
+        std::vector<std::string> names;
+        for (const auto &[name, content] : state())
+            if (before[name] != content) names.push_back(name);
+        return names;
+    }
     SqliteRows rows(const char *database, const std::string &sql) { return SqliteFile{root() + database}.rows(sql); }
     static constexpr const char *kDatabase = "/opt/dbspace/.dnet.db";
     static constexpr const char *kDatabase2 = "/opt/dbspace/.dnet2.db";
@@ -134,6 +170,35 @@ TEST_F(OperatorInstall, EachFlagAloneStartsItsGroupAndImsAfresh) {
         mark_every_file();
         install(2);
         EXPECT_THAT(rewritten(), ElementsAreArray(sorted({group.second_sim, "ims-2"}))) << group.flag;
+    }
+}
+
+// What each group brings beside its file; IMS comes in any case.
+TEST_F(OperatorInstall, EachFlagAloneLeavesEverythingElseAlone) {
+    struct Change {
+        const char *flag;
+        std::vector<std::string> first_sim;
+        std::vector<std::string> second_sim;
+    };
+    const Change changes[] = {
+        {"AutoVoicemail", {"voice-mail"}, {"voice-mail-2"}},
+        {"AutoEmailAccount", {"email-account"}, {"email-account"}},
+        {"AutoWbAmr", {"wb-amr", "db/zel/network/wb_amr_codec"}, {"wb-amr", "db/zel/network/wb_amr_codec"}},
+        {"AutoFastDormancy",
+         {"fast-dormancy", "fast_dormancy", "network_info"},
+         {"fast-dormancy-2", "2/fast_dormancy", "2/network_info"}},
+        {"AutoMaxPDP", {"max-pdp", "max_pdp"}, {"max-pdp-2", "2/max_pdp"}},
+    };
+    fill_databases();
+    set_int(kUpdated, 1);
+    for (const Change &change : changes) {
+        write_networks("TST", "TST", {}, network({change.flag}) + items_of_both());
+        std::vector<std::string> expected = change.first_sim;
+        expected.emplace_back("ims");
+        EXPECT_THAT(changed_by_install(1), ElementsAreArray(sorted(expected))) << change.flag;
+        expected = change.second_sim;
+        expected.emplace_back("ims-2");
+        EXPECT_THAT(changed_by_install(2), ElementsAreArray(sorted(expected))) << change.flag;
     }
 }
 

@@ -11,10 +11,6 @@ namespace {
 
 constexpr std::size_t kShownDigits = 3;
 
-template <std::size_t N> std::string text_of(const char (&field)[N]) {
-    return std::string{zel_svc_text_view(field, N)};
-}
-
 } // namespace
 
 ZelSvcSimMessage zel_svc_sim_message(const char *format, ...) {
@@ -39,7 +35,7 @@ std::string zel_svc_sim_msin_shown(std::string_view msin) {
 }
 
 std::string zel_svc_sim_operator_text(const ZelSvcSimOperator &entry) {
-    return text_of(entry.customer_name) + "_" + text_of(entry.network_name) + "('" + text_of(entry.mccmnc) +
-           "',(Subset)'" + text_of(entry.subset_code) + "',(GID)'" + text_of(entry.gid) + "',(SPName)'" +
-           text_of(entry.sp_name) + "')";
+    return zel_svc_sim_text(entry.customer_name) + "_" + zel_svc_sim_text(entry.network_name) + "('" +
+           zel_svc_sim_text(entry.mccmnc) + "',(Subset)'" + zel_svc_sim_text(entry.subset_code) + "',(GID)'" +
+           zel_svc_sim_text(entry.gid) + "',(SPName)'" + zel_svc_sim_text(entry.sp_name) + "')";
 }

@@ -19,6 +19,11 @@ __attribute__((format(printf, 1, 2))) ZelSvcSimMessage zel_svc_sim_message(const
 // Appends a message and a newline to a log; a log that cannot be opened is passed over.
 void zel_svc_sim_log_append(const char *path, const ZelSvcSimMessage &message);
 
+// The text of a record's field.
+template <std::size_t N> std::string zel_svc_sim_text(const char (&field)[N]) {
+    return std::string{zel_svc_text_view(field, N)};
+}
+
 // As much of an MSIN as a log may hold.
 std::string zel_svc_sim_msin_shown(std::string_view msin);
 

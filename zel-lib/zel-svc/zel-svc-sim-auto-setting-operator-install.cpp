@@ -35,10 +35,6 @@ constexpr Step kAfterProfiles[] = {
     {ZEL_SVC_PASS_IMS, KeptFor::Slot},
 };
 
-template <std::size_t N> std::string text_of(const char (&field)[N]) {
-    return std::string{zel_svc_text_view(field, N)};
-}
-
 bool read_active_customers_flags() {
     FixedText<10> active;
     FixedText<10> internal;
@@ -61,7 +57,7 @@ void run_pass(const Step &step, const ZelSvcSimOperator &entry, const ZelSvcSimS
                                {.wanted_flag = 1,
                                 .mode = ZEL_SVC_PARSE_MODE_OPERATOR,
                                 .variant = step.kept_for == KeptFor::Slot ? slot.data_variant : ZEL_SVC_DATA_SIM1,
-                                .path = zel_svc_customer_spec_path(text_of(entry.customer_name))});
+                                .path = zel_svc_customer_spec_path(zel_svc_sim_text(entry.customer_name))});
 }
 
 void install_profiles(const ZelSvcSimOperator &entry, const ZelSvcSimSlot &slot, int number) {
@@ -73,7 +69,7 @@ void install_profiles(const ZelSvcSimOperator &entry, const ZelSvcSimSlot &slot,
 void log_start(const ZelSvcSimOperator &entry, int slot) {
     ZEL_SVC_LOG("***** ZEL SIM auto settings / Install operator *****");
     ZEL_SVC_LOG("[SIM%d] API(pszCustomerName='%s',pszNetworkName='%s') run.", slot,
-                text_of(entry.customer_name).c_str(), text_of(entry.network_name).c_str());
+                zel_svc_sim_text(entry.customer_name).c_str(), zel_svc_sim_text(entry.network_name).c_str());
 }
 
 void log_end(const ZelSvcSimOperator &entry, const ZelSvcSimSlot &slot) {

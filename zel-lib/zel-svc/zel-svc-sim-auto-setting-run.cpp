@@ -23,10 +23,6 @@ struct Check {
     ZelSvcSimInfo sim;
 };
 
-template <std::size_t N> std::string text_of(const char (&field)[N]) {
-    return std::string{zel_svc_text_view(field, N)};
-}
-
 void tell(const Check &check, const ZelSvcSimMessage &message) {
     ZEL_SVC_LOG("[SIM%d] %s", check.slot.number, message.c_str());
     zel_svc_sim_log_append(check.log, message);
@@ -50,8 +46,8 @@ Identity identity_seen_last_time(const ZelSvcSimSlot &slot) {
 }
 
 void store_identity(const Check &check) {
-    vconf_set_str(check.slot.mccmnc.key, text_of(check.sim.mccmnc).c_str());
-    vconf_set_str(check.slot.msin.key, text_of(check.sim.msin).c_str());
+    vconf_set_str(check.slot.mccmnc.key, zel_svc_sim_text(check.sim.mccmnc).c_str());
+    vconf_set_str(check.slot.msin.key, zel_svc_sim_text(check.sim.msin).c_str());
 }
 
 ZelSvcSimMessage phone_text(const Identity &phone) {
@@ -61,9 +57,10 @@ ZelSvcSimMessage phone_text(const Identity &phone) {
 }
 
 ZelSvcSimMessage sim_text(const ZelSvcSimInfo &sim) {
-    return zel_svc_sim_message("SIM(MCCMNC='%s',MSIN(3)='%s',GID='%s',SPN='%s') inserted.", text_of(sim.mccmnc).c_str(),
-                               zel_svc_sim_msin_shown(text_of(sim.msin)).c_str(), text_of(sim.gid).c_str(),
-                               text_of(sim.spn).c_str());
+    return zel_svc_sim_message("SIM(MCCMNC='%s',MSIN(3)='%s',GID='%s',SPN='%s') inserted.",
+                               zel_svc_sim_text(sim.mccmnc).c_str(),
+                               zel_svc_sim_msin_shown(zel_svc_sim_text(sim.msin)).c_str(),
+                               zel_svc_sim_text(sim.gid).c_str(), zel_svc_sim_text(sim.spn).c_str());
 }
 
 bool is_readable(Check &check) {
@@ -86,7 +83,8 @@ bool reads_sim(Check &check) {
 bool is_another_sim(const Check &check, const Identity &phone) {
     tell(check, phone_text(phone));
     zel_svc_sim_log_append(check.log, sim_text(check.sim));
-    const bool changed = !(phone.mccmnc == text_of(check.sim.mccmnc)) || !(phone.msin == text_of(check.sim.msin));
+    const bool changed =
+        !(phone.mccmnc == zel_svc_sim_text(check.sim.mccmnc)) || !(phone.msin == zel_svc_sim_text(check.sim.msin));
     tell(check, zel_svc_sim_message(changed ? "SIM changed." : "SIM not changed."));
     return changed;
 }
@@ -108,8 +106,8 @@ void tell_candidates(const Check &check, std::span<const ZelSvcSimOperator> cand
     for (const ZelSvcSimOperator &entry : candidates) {
         const std::string text = zel_svc_sim_operator_text(entry);
         zel_svc_sim_log_append(check.log, zel_svc_sim_message("[Op%d] %s found.", number, text.c_str()));
-        ZEL_SVC_LOG("[SIM%d][Op%d] %s_%s found!", check.slot.number, number, text_of(entry.customer_name).c_str(),
-                    text_of(entry.network_name).c_str());
+        ZEL_SVC_LOG("[SIM%d][Op%d] %s_%s found!", check.slot.number, number,
+                    zel_svc_sim_text(entry.customer_name).c_str(), zel_svc_sim_text(entry.network_name).c_str());
         ++number;
     }
     ZEL_SVC_LOG("[SIM%d] opCount=%d.", check.slot.number, number);
