@@ -28,6 +28,7 @@ CREATE TABLE modem (slot INTEGER PRIMARY KEY, name TEXT NOT NULL, state INTEGER 
                     msin TEXT, gid TEXT, spn TEXT, result INTEGER);
 CREATE TABLE bookmark (id INTEGER PRIMARY KEY, parent INTEGER NOT NULL, folder INTEGER NOT NULL,
                        editable INTEGER NOT NULL, title TEXT NOT NULL, url TEXT NOT NULL);
+CREATE INDEX bookmark_title ON bookmark (parent, title);
 INSERT INTO bookmark VALUES (1, 0, 1, 0, 'Bookmarks', '');
 CREATE TABLE sync_account (id INTEGER PRIMARY KEY, attribute INTEGER NOT NULL, name TEXT NOT NULL,
                            address TEXT NOT NULL, user_id TEXT NOT NULL, password TEXT NOT NULL,

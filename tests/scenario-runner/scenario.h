@@ -10,6 +10,7 @@
 //         show keys /zel/sim             a section of the phone's state as it is now, or its lines with a text,
 //                                        kept with what is printed
 //         restart                        the phone restarts
+//         fail bookmark_zel_ sync_       a fault loop fails only functions that begin so; all without it
 //     NAME/phone-before/  files laid into the phone's root before the first step
 //     NAME/package/       a package of the scenario's own
 //     NAME/expected/      golden files, one a section of the phone's state, plus `output`

@@ -8,6 +8,7 @@
 #include <cstdio>
 #include <exception>
 #include <set>
+#include <sstream>
 #include <stdexcept>
 #include <utility>
 
@@ -34,6 +35,19 @@ std::string picking_text(const Json &entry) {
     return text.is_string() && entry.at("function") != "__dlog_print" ? text.get<std::string>() : std::string{};
 }
 
+// Whether the scenario wants the function to fail.
+bool is_chosen(const Scenario &scenario, const std::string &function) {
+    bool chosen = true;
+    for (const ScenarioStep &step : scenario.steps) {
+        if (step.word != "fail") continue;
+        std::istringstream prefixes{step.rest};
+        chosen = false;
+        for (std::string prefix; prefixes >> prefix;)
+            chosen = chosen || function.starts_with(prefix);
+    }
+    return chosen;
+}
+
 // The distinct calls of a good run, in the order of their first appearance.
 std::vector<Call> journal_of_good_run(const Scenario &scenario, PhoneState &good) {
     const std::size_t last = last_run(scenario);
@@ -47,7 +61,7 @@ std::vector<Call> journal_of_good_run(const Scenario &scenario, PhoneState &good
     const Json journal = run.phone().call("journal-list");
     for (const Json &entry : journal.at("calls")) {
         Call call{entry.at("function").get<std::string>(), picking_text(entry)};
-        if (seen.insert(call).second) calls.push_back(std::move(call));
+        if (is_chosen(scenario, call.first) && seen.insert(call).second) calls.push_back(std::move(call));
     }
     good = read_state(run.phone());
     return calls;

@@ -1,5 +1,6 @@
 // Data-sync accounts: verification against the sync agent, and what the export says of it.
 
+#include "counted-lists.h"
 #include "data-sync-spec.h"
 
 #include <gmock/gmock.h>
@@ -171,6 +172,24 @@ TEST_F(CheckedDataSync, CountIsExportedAsUnknownWithoutAgentOrList) {
     EXPECT_EQ(export_value(ZEL_SVC_ELEMENT_NB_DATA_SYNC), "??");
     EXPECT_EQ(exported_account(), kNothing);
     export_end(ZEL_SVC_ELEMENT_SYNCML);
+}
+
+TEST_F(CheckedDataSync, EveryListOfTheAgentIsReleasedAndEveryProfileToo) {
+    const std::string spec = syncml(leaf("NbDataSync", "2") + account("", "Work") + account("", "Home"));
+    // Two accounts: the count takes one list, each account a list of profiles and one of its services.
+    EXPECT_EQ(released_lists(), 0);
+    verify_spec(spec);
+    EXPECT_EQ(released_lists(), 5);
+    EXPECT_EQ(calls_of("sync_agent_ds_free_profile_info"), 6);
+    // A profile that cannot be read to its end.
+    fail("sync_agent_ds_get_sync_service_info", "", 1, 1);
+    verify_spec(spec);
+    EXPECT_EQ(released_lists(), 9);
+    EXPECT_EQ(calls_of("sync_agent_ds_free_profile_info"), 12);
+    // The clearing takes one, and the new accounts none.
+    install_spec(spec);
+    EXPECT_EQ(released_lists(), 10);
+    EXPECT_EQ(calls_of("sync_agent_ds_free_profile_info"), 16);
 }
 
 } // namespace zel_test

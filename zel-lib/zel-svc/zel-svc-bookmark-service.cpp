@@ -22,9 +22,6 @@ std::vector<int> list_of(const OwnedIds &ids, int count) {
     return {ids.get(), ids.get() + count};
 }
 
-// The service takes its texts without changing them.
-char *lent(const std::string &text) { return const_cast<char *>(text.c_str()); } // NOLINT(*-const-cast)
-
 std::optional<int> create(const bookmark_zel_info &info) {
     int id = 0;
     if (bookmark_zel_create(&info, &id) != 0) return std::nullopt;
@@ -41,7 +38,6 @@ bool BookmarkService::close() {
     return bookmark_zel_deinitialize() == 0;
 }
 
-// NOLINTBEGIN(readability-convert-member-functions-to-static)
 std::optional<int> BookmarkService::root() const {
     int id = 0;
     if (bookmark_zel_get_root(&id) != 0) return std::nullopt;
@@ -72,17 +68,16 @@ std::optional<std::vector<int>> BookmarkService::folders_titled(const char *titl
     return list_of(owned, count);
 }
 
-std::optional<int> BookmarkService::create_folder(const char *title, int parent) const {
-    const std::string text{title};
-    return create({.is_folder = 1, .parent = parent, .editable = 1, .title = lent(text), .url = nullptr});
+std::optional<int> BookmarkService::create_folder(std::string title, int parent) const {
+    return create({.is_folder = 1, .parent = parent, .editable = 1, .title = title.data(), .url = nullptr});
 }
 
-std::optional<int> BookmarkService::create_bookmark(const Info &bookmark) const {
+std::optional<int> BookmarkService::create_bookmark(Info bookmark) const {
     return create({.is_folder = 0,
                    .parent = bookmark.parent,
                    .editable = bookmark.editable ? 1 : 0,
-                   .title = lent(bookmark.title),
-                   .url = lent(bookmark.url)});
+                   .title = bookmark.title.data(),
+                   .url = bookmark.url.data()});
 }
 
 void BookmarkService::reset() const { bookmark_zel_reset(); }
@@ -94,4 +89,3 @@ std::optional<std::string> BookmarkService::manual_url() const {
 }
 
 bool BookmarkService::set_manual_url(const char *url) const { return bookmark_zel_set_user_manual_url(url) == 0; }
-// NOLINTEND(readability-convert-member-functions-to-static)

@@ -33,8 +33,8 @@ class BookmarkService {
     [[nodiscard]] std::optional<std::vector<int>> ids() const; // of bookmarks, without folders
     [[nodiscard]] std::optional<Info> info(int id) const;
     [[nodiscard]] std::optional<std::vector<int>> folders_titled(const char *title, int parent) const;
-    [[nodiscard]] std::optional<int> create_folder(const char *title, int parent) const;
-    [[nodiscard]] std::optional<int> create_bookmark(const Info &bookmark) const;
+    [[nodiscard]] std::optional<int> create_folder(std::string title, int parent) const;
+    [[nodiscard]] std::optional<int> create_bookmark(Info bookmark) const;
     void reset() const;
     [[nodiscard]] std::optional<std::string> manual_url() const; // empty when none was set
     [[nodiscard]] bool set_manual_url(const char *url) const;
