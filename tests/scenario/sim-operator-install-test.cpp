@@ -69,6 +69,10 @@ std::string dormancy(const std::string &network_name, const std::string &seconds
 std::string max_pdp(const std::string &network_name, const std::string &limit) {
     return element("MaxPDP", name(network_name) + element("MaxPDP3G", limit));
 }
+std::string bookmark(const std::string &network_name, const std::string &title) {
+    return element("Bookmark",
+                   name(network_name) + element("BookmarkName", title) + element("URL", "http://x.example"));
+}
 std::string ims(const std::string &network_name, const std::string &joyn) {
     return element("Setting", name(network_name) + element("RCS", element("Joyn", joyn)));
 }
@@ -77,7 +81,8 @@ std::string ims(const std::string &network_name, const std::string &joyn) {
 std::string items_of_both() {
     return voicemail("Two", "22") + voicemail("One", "11") + account("Two", "second") + account("One", "first") +
            wb_amr("Two", "off") + wb_amr("One", "on") + dormancy("Two", "2") + dormancy("One", "1.5") +
-           max_pdp("Two", "2") + max_pdp("One", "7") + element("IMSSetting", ims("Two", "off") + ims("One", "on"));
+           bookmark("Two", "second") + bookmark("One", "first") + bookmark("default", "all") + max_pdp("Two", "2") +
+           max_pdp("One", "7") + element("IMSSetting", ims("Two", "off") + ims("One", "on"));
 }
 
 std::vector<std::string> all_flags() {
@@ -122,6 +127,13 @@ class OperatorInstall : public zel_test::TwoSimPhone {
             file.run("insert into pdp_profile(profile_id, network_info_id) values(1, 40)");
         }
     }
+    nlohmann::json bookmark_titles() {
+        nlohmann::json titles = nlohmann::json::array();
+        const nlohmann::json list = call("bookmarks");
+        for (const nlohmann::json &entry : list.at("bookmarks"))
+            titles.push_back(entry.at("title"));
+        return titles;
+    }
     // Everything that an install may change, by name.
     std::map<std::string, std::string> state() {
         std::map<std::string, std::string> all;
@@ -131,6 +143,7 @@ class OperatorInstall : public zel_test::TwoSimPhone {
             for (const char *table : {"network_info", "fast_dormancy", "max_pdp", "pdp_profile"})
                 all[std::string{sim} + table] =
                     nlohmann::json(rows(database, std::string{"select * from "} + table)).dump();
+        all["bookmarks"] = bookmark_titles().dump();
         const nlohmann::json keys = call("vconf-list");
         for (const nlohmann::json &key : keys.at("keys"))
             all[key.at("key").get<std::string>()] = key.at("value").dump();
@@ -181,6 +194,7 @@ TEST_F(OperatorInstall, EachFlagAloneLeavesEverythingElseAlone) {
         std::vector<std::string> second_sim;
     };
     const Change changes[] = {
+        {"AutoBookmark", {"bookmark", "bookmarks"}, {"bookmark", "bookmarks"}},
         {"AutoVoicemail", {"voice-mail"}, {"voice-mail-2"}},
         {"AutoEmailAccount", {"email-account"}, {"email-account"}},
         {"AutoWbAmr", {"wb-amr", "db/zel/network/wb_amr_codec"}, {"wb-amr", "db/zel/network/wb_amr_codec"}},
@@ -240,6 +254,7 @@ TEST_F(OperatorInstall, TakesTheOperatorsEntriesOnly) {
     EXPECT_THAT(accounts, HasSubstr("first"));
     EXPECT_THAT(accounts, Not(HasSubstr("second")));
     EXPECT_EQ(get_int("db/zel/network/wb_amr_codec"), 1);
+    EXPECT_EQ(bookmark_titles(), nlohmann::json({"first", "all"}));
     EXPECT_EQ(rows(kDatabase, "select network_name, mccmnc from network_info"), (SqliteRows{{"One", "26201"}}));
     EXPECT_EQ(rows(kDatabase, "select lcd_on_timeout from fast_dormancy"), (SqliteRows{{"1500"}}));
     EXPECT_EQ(rows(kDatabase, "select max_pdp_3g from max_pdp"), (SqliteRows{{"7"}}));
