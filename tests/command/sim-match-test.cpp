@@ -118,6 +118,18 @@ TEST_F(ZelSimMatch, MatrixIsForPeopleToo) {
         EXPECT_THAT(page, HasSubstr(text));
 }
 
+TEST_F(ZelSimMatch, SaysWhenThereAreMoreEntriesThanAreRead) {
+    std::string networks;
+    for (int number = 0; number < 271; ++number)
+        networks += network("N" + std::to_string(number), "21401");
+    write_networks("AAA", networks);
+    for (const char *command : {"operators", "matrix"}) {
+        const Outcome outcome = run_zel({"sim", command});
+        EXPECT_EQ(outcome.code, 0);
+        EXPECT_THAT(outcome.err, HasSubstr("only the first 270 entries are read")) << command;
+    }
+}
+
 TEST_F(ZelSimMatch, NeedsACustomerWithAReadableFile) {
     EXPECT_THAT(run_zel({"sim", "matrix", "CCC"}).err, HasSubstr("/Customer/CCC/customer.xml"));
     EXPECT_EQ(run_zel({"sim", "match", "--mccmnc", "21401", "--customer", "CCC"}).code, 1);

@@ -37,6 +37,14 @@ TEST_F(ZelSimRun, InstallsAndTellsWhatItWroteAboutEachSlot) {
     EXPECT_EQ(get_string(kMsin), "9812345678");
 }
 
+TEST_F(ZelSimRun, JournalPageHidesTheMsinThatWasStored) {
+    insert(1, "05", "9812345678");
+    call("journal-start");
+    EXPECT_EQ(json_of({"sim", "run"}).at("result"), 0);
+    EXPECT_THAT(run({"phone", "journal-list"}), Not(HasSubstr("9812")));
+    EXPECT_THAT(run({"phone", "journal-list", "--reveal"}), HasSubstr("9812345678"));
+}
+
 TEST_F(ZelSimRun, OfAKnownSimTellsThisRunsLinesOnly) {
     insert(1, "05", "9812345678");
     EXPECT_EQ(json_of({"sim", "run"}).at("result"), 0);

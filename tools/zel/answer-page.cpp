@@ -14,9 +14,15 @@ bool repeats_another(const Json &object, const std::string &name) {
     return name.ends_with("_hex") && object.contains(name.substr(0, name.size() - 4));
 }
 
-// A member such as "msin" is secret by its name, "value" by the key beside it.
+bool names_secret(const Json &object, const char *member) {
+    const auto found = object.find(member);
+    return found != object.end() && found->is_string() && is_secret(bytes_of(object, member));
+}
+
+// A member such as "msin" is secret by its name, "value" by the key beside it, a call's arguments by its text.
 bool is_secret_member(const Json &object, const std::string &name) {
-    return is_secret(name) || (name == "value" && object.contains("key") && is_secret(bytes_of(object, "key")));
+    return is_secret(name) || (name == "value" && names_secret(object, "key")) ||
+           (name == "arguments" && names_secret(object, "text"));
 }
 
 std::string cell(const Json &object, const std::string &name, bool reveal) {

@@ -16,6 +16,13 @@ std::vector<ZelSvcSimOperator> copy_of(std::span<const ZelSvcSimOperator> entrie
     return {entries.begin(), entries.end()};
 }
 
+// The library keeps no more; what stands behind is passed over in silence.
+void report_full_list(const Invocation &invocation, std::size_t count) {
+    if (count < ZEL_SVC_MAX_OPERATORS) return;
+    report(invocation.command->name + ": only the first " + std::to_string(count) +
+           " entries are read; those behind them are never matched");
+}
+
 [[noreturn]] void fail_without_customer(const Invocation &invocation) {
     throw Failure{kFailed, invocation.command->name + ": the phone in '" + invocation.root + "' has no active customer",
                   "Make a customer the active one with 'zel install CUSTOMER' or 'zel imei CUSTOMER'."};
@@ -41,6 +48,7 @@ CustomerOperators operators_of(const Invocation &invocation, const std::string &
     const RunWatch watch{false};
     CustomerOperators result{code, copy_of(zel_svc_sim_operators_of(code))};
     require_readable_files(invocation, watch);
+    report_full_list(invocation, result.entries.size());
     return result;
 }
 
@@ -85,6 +93,7 @@ int sim_operators(Invocation &invocation) {
     zel_svc_sim_auto_setting_get_operator_list(list.data(), &count, invocation.has("all") ? 1 : 0);
     require_readable_files(invocation, watch);
     list.resize(static_cast<std::size_t>(count));
+    report_full_list(invocation, list.size());
     Json answer = Json::array();
     std::vector<std::vector<std::string>> rows;
     for (std::size_t i = 0; i < list.size(); ++i) {
