@@ -70,11 +70,30 @@ static void ask_for_the_operator(void) {
     CHECK(zel_svc_sim_auto_setting_clear_active_operator() == 1);
 }
 
+static void ask_for_the_sim(void) {
+    static ZelSvcSimOperator operators[ZEL_SVC_MAX_OPERATORS];
+    ZelSvcSimInfo sim;
+    int32_t count = -1;
+    CHECK(zel_svc_sim_auto_setting_chk_feature_enable() == 0);
+    CHECK(zel_svc_sim_auto_setting_execute_by_sim() == ZEL_SVC_SIM_DISABLED);
+    CHECK(zel_svc_sim_auto_setting_get_sim_info(&sim, 1) == 0);
+    CHECK(sim.mccmnc[0] == '\0');
+    zel_svc_sim_auto_setting_get_operator_list(operators, &count, 1);
+    CHECK(count == 1);
+    CHECK(strcmp(operators[0].network_name, "Network") == 0);
+    memcpy(sim.mccmnc, "00101", sizeof "00101");
+    zel_svc_sim_auto_setting_get_operator_list_by_sim(&sim, operators, &count);
+    CHECK(count == 0);
+    zel_svc_sim_auto_setting_install_operator(&operators[0], 1);
+    CHECK(zel_svc_reinstall_connection(7) == 7);
+}
+
 int main(void) {
     configure();
     ask_for_the_customer();
     ask_for_the_package();
     ask_for_the_operator();
+    ask_for_the_sim();
     CHECK(zel_svc_config_print_log_file("[C] done.\n") == 1);
     CHECK(zel_svc_config_set_pre_config_for_factory_reset() == 1);
     zel_svc_config_reboot();

@@ -20,7 +20,8 @@ class CProgram : public zel_test::ServicePhone {
 TEST_F(CProgram, UsesEveryFunction) {
     write_header("<CustomerDataSet><ZELName>NAME01</ZELName><ZELVersion>V02</ZELVersion><NbCustomer>1</NbCustomer>"
                  "<CustomerData src=\"/Customer/XFV/customer.xml\"/></CustomerDataSet>");
-    write_customer("XFV", "<GeneralInfo><CountryISO>ZA</CountryISO></GeneralInfo>");
+    write_customer("XFV", "<GeneralInfo><CountryISO>ZA</CountryISO><NetworkInfo><NetworkName>Network</NetworkName>"
+                          "<MCCMNC>00101</MCCMNC></NetworkInfo></GeneralInfo>");
     EXPECT_EQ(run(), 0);
     EXPECT_EQ(get_string("db/zel/country_iso"), "ZA");
     EXPECT_EQ(call("status").at("restarts_asked"), 1);
