@@ -5,6 +5,7 @@
 #   make test        build everything and run all tests
 #   make check       formatting, lint, layers, symbols, documents, device build, C headers
 #   make check-asan  all tests under AddressSanitizer and UBSan
+#   make check-page  the page of zel verify, in a headless Chromium
 #   make bench       the benchmarks, as a table
 #   make fuzz SECONDS=60         every fuzz target for that long
 #   make install PREFIX=/usr/local
@@ -14,7 +15,7 @@ SECONDS = 60
 PREFIX = /usr/local
 CHECKS = format layers tidy symbols docs device headers
 
-.PHONY: demo test deps check check-asan bench fuzz install clean $(CHECKS:%=check-%)
+.PHONY: demo test deps check check-asan check-page bench fuzz install clean $(CHECKS:%=check-%)
 
 demo:
 	@scripts/install-deps build
@@ -32,6 +33,10 @@ check: $(CHECKS:%=check-%)
 check-asan:
 	@scripts/install-deps build test
 	@scripts/test asan
+
+check-page:
+	@scripts/install-deps build page
+	@scripts/check-page
 
 bench:
 	@scripts/install-deps build bench

@@ -20,9 +20,11 @@ struct Slot {
     std::string text;
 };
 
-// A required argument of a bench phone's verb may also be typed as the option that the verb's table calls it.
+// An option may have a letter. A required argument of a bench phone's verb may also be typed as the option that the
+// verb's table calls it.
 std::string spelling_of(const Parameter &parameter) {
-    if (parameter.form == Parameter::Form::kOption) return "--" + parameter.name;
+    const std::string letter = parameter.letter.empty() ? "" : "-" + parameter.letter + ",";
+    if (parameter.form == Parameter::Form::kOption) return letter + "--" + parameter.name;
     return parameter.argument.empty() ? parameter.name : parameter.name + ",--" + parameter.argument;
 }
 

@@ -78,6 +78,28 @@ std::vector<Command> own_commands() {
                  "without an active customer, or when its file cannot be read to its end.",
          .access = Access::kWrites,
          .run = locks},
+        {.name = "verify",
+         .parameters = {flag("imei", "the short answer of factory tools: how many values differ, and the first"),
+                        flag("failures", "only what differs"),
+                        option("html", "FILE", "write one page for a browser as well, which needs no other file")},
+         .help = "Compare the phone with the active customer's file, and write the report.",
+         .more = "Exits 4 when anything differs: a value of the customer's file, a media folder since the install, an "
+                 "application's result. Exits 1 without an active customer (--imei counts that as one difference), "
+                 "when its file cannot be read to its end, or when the report cannot be written.\n"
+                 "Passwords are masked, in JSON and on the page too; --reveal shows them.\n"
+                 "Writes: \"/opt/system/zel-default/output/zel-verification-report.log\", \"zel-fs-status-verify.ini\" "
+                 "beside it, and the keys that 'zel version' writes.",
+         .access = Access::kWrites,
+         .run = verify},
+        {.name = "export",
+         .parameters = {with_letter("o", option("output", "FILE", "write the document there, not to standard output")),
+                        flag("installable", "add the networks of the package, without which no profile installs")},
+         .help = "Print the phone's settings as a customer's file.",
+         .more = "What such a file cannot carry is listed in docs/export.md. Each value that could not be read, and "
+                 "each that holds '<', is named on standard error. Passwords are in the document as they are.\n"
+                 "Writes: \"/opt/system/zel-default/output/customer-phone.xml\".",
+         .access = Access::kWrites,
+         .run = export_phone},
         {.name = "log",
          .parameters = {flag("system", "the phone's system log in place of the run log")},
          .help = "Print the run log: what installs and upgrades did.",
@@ -136,7 +158,7 @@ const std::vector<Parameter> &common_options() {
         option("root", "DIR", "the phone's folder; else $ZEL_ROOT names it"),
         flag("json", "print data as JSON"),
         flag("reveal", "show MSINs and passwords"),
-        flag("verbose", "tell more on standard error"),
+        with_letter("v", flag("verbose", "tell more on standard error")),
     };
     return options;
 }

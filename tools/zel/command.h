@@ -26,6 +26,7 @@ struct Parameter {
     bool required = true;
     bool integer = false;      // the value must be a number
     std::string argument = {}; // of a bench phone's verb: the argument's own name
+    std::string letter = {};   // an option's short name: "o"
 };
 
 inline Parameter positional(std::string name, std::string help) { return {std::move(name), std::move(help)}; }
@@ -37,6 +38,11 @@ inline Parameter option(std::string name, std::string value, std::string help) {
 }
 inline Parameter flag(std::string name, std::string help) {
     return {.name = std::move(name), .help = std::move(help), .form = Parameter::Form::kFlag, .required = false};
+}
+
+inline Parameter with_letter(std::string letter, Parameter parameter) {
+    parameter.letter = std::move(letter);
+    return parameter;
 }
 
 class Invocation;

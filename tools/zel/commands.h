@@ -21,6 +21,12 @@ int approval(Invocation &invocation);
 // locks.cpp
 int locks(Invocation &invocation);
 
+// verify.cpp
+int verify(Invocation &invocation);
+
+// export.cpp
+int export_phone(Invocation &invocation);
+
 // log.cpp
 int log(Invocation &invocation);
 

@@ -108,7 +108,7 @@ std::vector<std::string> groups() {
 
 std::string typed_option(const Parameter &parameter) {
     const std::string dashed = "--" + parameter.name + (parameter.value.empty() ? "" : " " + parameter.value);
-    return parameter.name == "verbose" ? "-v, " + dashed : dashed;
+    return parameter.letter.empty() ? dashed : "-" + parameter.letter + ", " + dashed;
 }
 
 std::string usage_of(const Command &command) {

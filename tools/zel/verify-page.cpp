@@ -1,0 +1,153 @@
+#include "verify-page.h"
+
+#include "html.h"
+#include "verify-page-style.h"
+
+#include <algorithm>
+#include <cstdio>
+
+namespace zel_command {
+namespace {
+
+struct Group {
+    std::string name;
+    std::vector<const VerifiedValue *> values; // failures first
+    std::size_t failed = 0;
+};
+
+std::string element(const std::string &tag, std::string_view text) {
+    return "<" + tag + ">" + html_text(text) + "</" + tag.substr(0, tag.find(' ')) + ">";
+}
+
+std::string policy() {
+    return "default-src 'none'; style-src 'sha256-" + std::string{kPageStyleSum} + "'; script-src 'sha256-" +
+           std::string{kPageScriptSum} + "'";
+}
+
+std::string head(const Verification &found) {
+    std::string text = "<!DOCTYPE html>\n<html lang=\"en\">\n<head>\n<meta charset=\"utf-8\">\n";
+    text += "<meta http-equiv=\"Content-Security-Policy\" content=\"" + policy() + "\">\n";
+    text += "<meta name=\"viewport\" content=\"width=device-width, initial-scale=1\">\n";
+    text += element("title", "Verification of " + found.sales_code) + "\n";
+    return text.append("<style>").append(kPageStyle).append("</style>\n</head>\n<body>\n");
+}
+
+std::string fact(const std::string &name, std::string_view text) {
+    return element("dt", name) + element("dd", text) + "\n";
+}
+
+std::string of(std::size_t failed, std::size_t all) { return std::to_string(failed) + " of " + std::to_string(all); }
+
+std::string summary(const Verification &found) {
+    const std::size_t failed = found.failed(VerifiedKind::kSpec);
+    std::string text = element("h1", "Verification of " + found.sales_code) + "\n";
+    text += failed == 0 ? element("p class=\"verdict ok\"", "OK") : element("p class=\"verdict not-ok\"", "NOT OK");
+    text += "\n<dl>\n" + fact("Package", found.package_version) + fact("Sales code", found.sales_code);
+    if (found.internal_name != found.sales_code) text += fact("Internal name", found.internal_name);
+    text += fact("Customer's file", of(failed, found.count(VerifiedKind::kSpec)) + " values differ");
+    text += fact("Media folders",
+                 of(found.failed(VerifiedKind::kMedia), found.count(VerifiedKind::kMedia)) + " figures changed");
+    text += fact("Applications", of(found.failed(VerifiedKind::kApplication), found.count(VerifiedKind::kApplication)) +
+                                     " results failed");
+    return text + "</dl>\n";
+}
+
+// Media folders have a table of their own.
+std::vector<Group> groups_of(const Verification &found) {
+    std::vector<Group> groups;
+    for (const VerifiedValue &value : found.values) {
+        if (value.kind == VerifiedKind::kMedia) continue;
+        const std::string name = value.group();
+        auto group = std::find_if(groups.begin(), groups.end(), [&](const Group &known) { return known.name == name; });
+        if (group == groups.end()) group = groups.insert(groups.end(), {name, {}, 0});
+        group->values.push_back(&value);
+        group->failed += value.passed ? 0 : 1;
+    }
+    for (Group &group : groups)
+        std::stable_partition(group.values.begin(), group.values.end(),
+                              [](const VerifiedValue *value) { return !value->passed; });
+    std::stable_partition(groups.begin(), groups.end(), [](const Group &group) { return group.failed != 0; });
+    return groups;
+}
+
+std::string value_row(const VerifiedValue &value, bool reveal) {
+    const VerifiedValue seen = shown(value, reveal);
+    std::string row = seen.passed ? "<div class=\"value\"><b>pass</b>" : "<div class=\"value failed\"><b>failure</b>";
+    row += element("span", seen.label);
+    const bool compared = seen.kind == VerifiedKind::kSpec;
+    row += element(compared ? "i data-is=\"package\"" : "i", seen.expected);
+    if (compared) row += element("u data-is=\"phone\"", seen.phone);
+    return row + "</div>\n";
+}
+
+std::string values(const Verification &found, bool reveal) {
+    std::string text = "<h2>Values</h2>\n<div class=\"filter\" hidden>"
+                       "<input type=\"search\" id=\"words\" placeholder=\"Filter values\" aria-label=\"Filter values\">"
+                       "<label><input type=\"checkbox\" id=\"failures\"> failures only</label></div>\n";
+    for (const Group &group : groups_of(found)) {
+        text += "<section class=\"group\" data-name=\"" + html_text(group.name) + "\">\n<h3>" + html_text(group.name);
+        text += " <small>" + (group.failed == 0 ? std::to_string(group.values.size()) + " passed"
+                                                : of(group.failed, group.values.size()) + " failed");
+        text += "</small></h3>\n";
+        for (const VerifiedValue *value : group.values)
+            text += value_row(*value, reveal);
+        text += "</section>\n";
+    }
+    return text + "<p id=\"none\" hidden>No value fits.</p>\n";
+}
+
+std::string media_cells(const VerifiedValue &value) {
+    const std::string changed = value.passed ? "" : " class=\"changed\"";
+    return element("td", value.expected) + element("td" + changed, value.phone);
+}
+
+// Two lines of the report, size and count, make one row.
+std::string media(const Verification &found) {
+    std::string rows;
+    const auto &values = found.values;
+    for (std::size_t i = 0; i + 1 < values.size(); i += 2) {
+        if (values[i].kind != VerifiedKind::kMedia || values[i + 1].kind != VerifiedKind::kMedia) break;
+        const std::string name = values[i].label.substr(0, values[i].label.find(' '));
+        rows += "<tr>" + element("td", name) + media_cells(values[i]) + media_cells(values[i + 1]) + "</tr>\n";
+    }
+    if (rows.empty()) return {};
+    return "<h2>Media folders</h2>\n<div class=\"wide\"><table id=\"media\">\n<tr><th>Folder</th><th>Bytes after the "
+           "install</th><th>now</th><th>Files after the install</th><th>now</th></tr>\n" +
+           rows + "</table></div>\n";
+}
+
+std::string seconds_text(double seconds) {
+    char text[32];
+    std::snprintf(text, sizeof text, "%.3f s", seconds);
+    return text;
+}
+
+// A clock that was set back meanwhile gives a lap below zero, which has no bar.
+std::string lap_row(const TimeLap &lap, double longest) {
+    char width[32];
+    std::snprintf(width, sizeof width, "%.2f", longest > 0 ? std::max(lap.seconds, 0.0) / longest * 100 : 0.0);
+    return "<div class=\"lap\">" + element("span", lap.phase) +
+           "<svg viewBox=\"0 0 100 1\" preserveAspectRatio=\"none\" aria-hidden=\"true\"><rect width=\"" + width +
+           "\" height=\"1\"/></svg>" + element("span", seconds_text(lap.seconds)) + "</div>\n";
+}
+
+std::string laps(const std::vector<TimeLap> &all) {
+    if (all.empty()) return {};
+    double longest = 0;
+    for (const TimeLap &lap : all)
+        longest = std::max(longest, lap.seconds);
+    std::string text = "<h2>Times of the last install</h2>\n";
+    for (const TimeLap &lap : all)
+        text += lap_row(lap, longest);
+    return text;
+}
+
+} // namespace
+
+std::string verify_page(const VerifyPage &page) {
+    std::string text = head(page.found) + summary(page.found) + values(page.found, page.reveal);
+    text += media(page.found) + laps(page.laps);
+    return text.append("<script>").append(kPageScript).append("</script>\n</body>\n</html>\n");
+}
+
+} // namespace zel_command
