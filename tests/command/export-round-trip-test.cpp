@@ -16,32 +16,31 @@ using ::testing::Not;
 
 namespace {
 
-std::string good_output(const std::vector<std::string> &words) {
+std::string output_of(const std::vector<std::string> &words, int code = 0) {
     const Outcome outcome = run_zel(words);
-    EXPECT_EQ(outcome.code, 0) << words[2] << outcome.err;
+    EXPECT_EQ(outcome.code, code) << words[2] << outcome.err;
     return outcome.out;
 }
 
 // A phone with the example package beside the test's own.
 class OtherPhone {
   public:
-    OtherPhone() {
-        good_output({"--root", root(), "phone", "create", "--package", source_dir() + "/examples/package"});
-    }
+    OtherPhone() { output_of({"--root", root(), "phone", "create", "--package", source_dir() + "/examples/package"}); }
     OtherPhone(const OtherPhone &) = delete;
     OtherPhone &operator=(const OtherPhone &) = delete;
     ~OtherPhone() { remove_folder(folder_); }
 
     [[nodiscard]] std::string root() const { return folder_ + "/phone"; }
-    std::string run(std::vector<std::string> words) const {
+    std::string run(std::vector<std::string> words, int code = 0) const {
         words.insert(words.begin(), {"--root", root()});
-        return good_output(words);
+        return output_of(words, code);
     }
     // Puts a document in the place of a customer's file, and installs it.
-    void install(const std::string &customer, const std::string &folder, const std::string &document) const {
+    void install(const std::string &customer, const std::string &folder, const std::string &document,
+                 int code = 0) const {
         const std::string path = root() + "/opt/system/zel/mps/ZEL/Customer/" + folder + "/customer.xml";
         std::ofstream{path, std::ios::binary | std::ios::trunc} << document;
-        run({"install", customer});
+        run({"install", customer}, code);
     }
 
   private:
@@ -88,4 +87,49 @@ TEST_F(ExportRoundTrip, WithoutNetworksLosesTheProfilesAlone) {
         EXPECT_EQ(without_connections(again), without_connections(document)) << sold.customer;
         EXPECT_THAT(again, Not(HasSubstr("<Profile>"))) << sold.customer;
     }
+}
+
+namespace {
+
+// What a key of the settings store becomes when the document of a phone is installed on a second one.
+struct Passed {
+    std::string value;
+    std::string written;
+    std::string becomes;
+    int code = 0; // of the second install
+};
+
+} // namespace
+
+TEST_F(ExportRoundTrip, OfOddTextsIsAsTheDocumentationTells) {
+    const OtherPhone first;
+    const OtherPhone second;
+    first.run({"install", "MCI"});
+    for (const Passed &text :
+         {Passed{"A & B", "A &amp; B", "A & B"}, Passed{"&lt;b&gt;", "&amp;lt;b&amp;gt;", "<b>"},
+          Passed{" \t GB ", " \t GB ", "GB "}, Passed{"\"GB\" 'x' >", "\"GB\" 'x' >", "\"GB\" 'x' >"},
+          Passed{"G<B", "G<B", "G", 1}, Passed{std::string(250, 'x'), std::string(199, 'x'), std::string(199, 'x')}}) {
+        first.run({"vconf", "set", "db/zel/country_iso", text.value});
+        const std::string document = first.run({"export"});
+        EXPECT_THAT(document, HasSubstr("<CountryISO>" + text.written + "</CountryISO>\n"));
+        // What stands behind a "<" is read as a tag; the value in front of it counts.
+        second.install("MCI", "MCI", document, text.code);
+        EXPECT_EQ(second.run({"vconf", "get", "db/zel/country_iso"}), text.becomes + "\n") << text.value;
+    }
+}
+
+TEST_F(ExportRoundTrip, OfAnUnreadableNumberIsZeroAndOfAnUnreadableWordNothing) {
+    const OtherPhone first;
+    const OtherPhone second;
+    first.run({"install", "XFV"});
+    second.run({"install", "XFV"});
+    const std::string policy = second.run({"vconf", "get", "file/private/wifi/sleep_policy"});
+    first.run({"vconf", "unset", "db/private/com.quorvex.message-lite/sms_page_limit"});
+    first.run({"vconf", "unset", "file/private/wifi/sleep_policy"});
+    const std::string document = first.run({"export"});
+    EXPECT_THAT(document, HasSubstr("<PageLimit>?\?</PageLimit>\n"));
+    EXPECT_THAT(document, HasSubstr("<SleepPolicy>?\?</SleepPolicy>\n"));
+    second.install("XFV", "XFV", document);
+    EXPECT_EQ(second.run({"vconf", "get", "db/private/com.quorvex.message-lite/sms_page_limit"}), "0\n");
+    EXPECT_EQ(second.run({"vconf", "get", "file/private/wifi/sleep_policy"}), policy);
 }

@@ -7,3 +7,5 @@ foreach(topic checker guide generators remake)
   add_test(NAME package.${topic} COMMAND Python3::Interpreter -B ${CMAKE_CURRENT_LIST_DIR}/test_${topic}.py)
   set_tests_properties(package.${topic} PROPERTIES COST 50 TIMEOUT 300) # long ones first: the short ones fill the gaps
 endforeach()
+add_test(NAME package.export COMMAND Python3::Interpreter -B ${CMAKE_CURRENT_LIST_DIR}/test_export.py $<TARGET_FILE:zel>)
+set_tests_properties(package.export PROPERTIES COST 50 TIMEOUT 120)

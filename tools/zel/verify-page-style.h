@@ -29,7 +29,7 @@ dd { margin: 0; }
   padding: .5rem 0; background: var(--bg); border-bottom: 1px solid var(--line); }
 .filter input[type=search] { flex: 1 1 12rem; min-width: 0; padding: .4rem .6rem; font: inherit; color: inherit;
   background: var(--card); border: 1px solid var(--line); border-radius: .4rem; }
-.value { display: grid; grid-template-columns: 4.5rem minmax(8rem, 1fr) minmax(0, 1.2fr) minmax(0, 1.2fr);
+.value { display: grid; grid-template-columns: 4.5rem minmax(8rem, 1fr) minmax(0, 1fr) minmax(0, 1fr);
   gap: 0 1rem; padding: .3rem .5rem; border-bottom: 1px solid var(--line); }
 .value.failed { background: var(--bad-bg); }
 .value b { color: var(--good); }
@@ -39,7 +39,7 @@ dd { margin: 0; }
 .wide { overflow-x: auto; }
 table { border-collapse: collapse; width: 100%; }
 th, td { padding: .25rem .5rem; text-align: right; border-bottom: 1px solid var(--line); }
-th:first-child, td:first-child { text-align: left; }
+th:first-child, td:first-child { text-align: left; overflow-wrap: normal; }
 th { color: var(--dim); font-weight: normal; }
 td.changed { color: var(--bad); background: var(--bad-bg); font-weight: 600; }
 .lap { display: grid; grid-template-columns: 12rem 1fr 5.5rem; gap: 0 .75rem; align-items: center;
@@ -84,7 +84,7 @@ document.querySelector('.filter').hidden = false;
 filter();
 )js";
 
-inline constexpr std::string_view kPageStyleSum = "J6ohBE6p/XrMwK6CidmVAXY//hq2aW41mdGQOwB+6uA=";
+inline constexpr std::string_view kPageStyleSum = "VJVRZcOheaifpss4ec0/9py2NZ2hZvLWg4nmt3Q8H4o=";
 inline constexpr std::string_view kPageScriptSum = "Uu6kR5Fx+nbFij4J/BxaGm7ED2uiEmHWS6JclU9HjPA=";
 
 } // namespace zel_command

@@ -70,10 +70,16 @@ std::vector<Group> groups_of(const Verification &found) {
     return groups;
 }
 
+// Under a heading "GPS" the value "GPS/GPSActivation" needs no "GPS" of its own.
+std::string in_its_group(const VerifiedValue &value) {
+    const std::string head = value.group() + "/";
+    return value.label.starts_with(head) ? value.label.substr(head.size()) : value.label;
+}
+
 std::string value_row(const VerifiedValue &value, bool reveal) {
     const VerifiedValue seen = shown(value, reveal);
     std::string row = seen.passed ? "<div class=\"value\"><b>pass</b>" : "<div class=\"value failed\"><b>failure</b>";
-    row += element("span", seen.label);
+    row += element("span", in_its_group(seen));
     const bool compared = seen.kind == VerifiedKind::kSpec;
     row += element(compared ? "i data-is=\"package\"" : "i", seen.expected);
     if (compared) row += element("u data-is=\"phone\"", seen.phone);
@@ -81,7 +87,7 @@ std::string value_row(const VerifiedValue &value, bool reveal) {
 }
 
 std::string values(const Verification &found, bool reveal) {
-    std::string text = "<h2>Values</h2>\n<div class=\"filter\" hidden>"
+    std::string text = "<div id=\"values\">\n<h2>Values</h2>\n<div class=\"filter\" hidden>"
                        "<input type=\"search\" id=\"words\" placeholder=\"Filter values\" aria-label=\"Filter values\">"
                        "<label><input type=\"checkbox\" id=\"failures\"> failures only</label></div>\n";
     for (const Group &group : groups_of(found)) {
@@ -93,7 +99,7 @@ std::string values(const Verification &found, bool reveal) {
             text += value_row(*value, reveal);
         text += "</section>\n";
     }
-    return text + "<p id=\"none\" hidden>No value fits.</p>\n";
+    return text + "<p id=\"none\" hidden>No value fits.</p>\n</div>\n";
 }
 
 std::string media_cells(const VerifiedValue &value) {
@@ -107,7 +113,8 @@ std::string media(const Verification &found) {
     const auto &values = found.values;
     for (std::size_t i = 0; i + 1 < values.size(); i += 2) {
         if (values[i].kind != VerifiedKind::kMedia || values[i + 1].kind != VerifiedKind::kMedia) break;
-        const std::string name = values[i].label.substr(0, values[i].label.find(' '));
+        const std::string &label = values[i].label; // "media/image size"
+        const std::string name = label.substr(label.find('/') + 1, label.find(' ') - label.find('/') - 1);
         rows += "<tr>" + element("td", name) + media_cells(values[i]) + media_cells(values[i + 1]) + "</tr>\n";
     }
     if (rows.empty()) return {};
