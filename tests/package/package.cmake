@@ -3,7 +3,7 @@ find_package(Python3 3.9 COMPONENTS Interpreter REQUIRED)
 
 add_test(NAME package.ExampleIsReadableAndUsesEveryElement
          COMMAND Python3::Interpreter ${PROJECT_SOURCE_DIR}/scripts/check-example)
-foreach(topic checker guide generators remake)
+foreach(topic checker guide generators presets remake)
   add_test(NAME package.${topic} COMMAND Python3::Interpreter -B ${CMAKE_CURRENT_LIST_DIR}/test_${topic}.py)
   set_tests_properties(package.${topic} PROPERTIES COST 50 TIMEOUT 300) # long ones first: the short ones fill the gaps
 endforeach()

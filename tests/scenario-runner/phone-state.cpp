@@ -16,6 +16,7 @@ namespace {
 
 namespace fs = std::filesystem;
 
+constexpr const char *kDefault = "/opt/system/zel-default";
 constexpr const char *kOutput = "/opt/system/zel-default/output";
 constexpr const char *kData = "/opt/system/zel-default/data";
 
@@ -158,6 +159,27 @@ void add_section_store(Phone &phone, PhoneState &state) {
         add(state, "data/" + file.path().filename().string(), lines_of(content(file.path())));
 }
 
+// What install runs write beside the section store: merged presets, versions, application lists and results.
+void add_preconfiguration(Phone &phone, PhoneState &state) {
+    const std::string base = kDefault;
+    add(state, "preset", file_lines(phone, base + "/preset/zel-default-preset.ini"));
+    add(state, "fs-update", file_lines(phone, base + "/fsupdate/zel-fsupdate-info.ini"));
+    for (const char *name : {"appresult_def.ini", "appresult.ini"})
+        add(state, std::string{"app/"} + name, file_lines(phone, base + "/app/" + name));
+}
+
+// What services of the phone were told.
+std::vector<std::string> services(Phone &phone) {
+    std::vector<std::string> lines;
+    const Json status = phone.call("status");
+    for (const char *name : {"theme_picture", "initial_keyboard", "active_keyboard", "time_zone"})
+        lines.push_back(std::string{name} + " = " + shown(status.at(name)));
+    const Json list = phone.call("app-list");
+    for (const Json &one : list.at("applications"))
+        lines.push_back("application " + shown(one.at("name")) + " " + shown(one.at("state")));
+    return lines;
+}
+
 } // namespace
 
 std::vector<std::string> lines_of(const std::string &text) {
@@ -195,6 +217,8 @@ PhoneState read_state(Phone &phone) {
     add(state, "report", report(phone, output + "/zel-verification-report.log"));
     add(state, "document", file_lines(phone, output + "/customer-phone.xml"));
     add(state, "files", files(phone));
+    add(state, "services", services(phone));
+    add_preconfiguration(phone, state);
     add_section_store(phone, state);
     add_databases(phone, state);
     return state;
