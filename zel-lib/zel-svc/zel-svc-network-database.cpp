@@ -33,7 +33,9 @@ int NetworkStatement::bind_result(int parameter, std::string_view text) {
     return sqlite3_bind_text(statement_.get(), parameter, bytes, static_cast<int>(text.size()), SQLITE_TRANSIENT);
 }
 
-bool NetworkStatement::bind_null(int parameter) { return note(sqlite3_bind_null(statement_.get(), parameter)); }
+int NetworkStatement::bind_result(int parameter, std::nullptr_t /*null*/) {
+    return sqlite3_bind_null(statement_.get(), parameter);
+}
 
 NetworkStep NetworkStatement::step() {
     if (!statement_ || !bound_) return NetworkStep::Failed;

@@ -13,6 +13,7 @@
 // Every value is bound, so no text of a customer's package can change a statement. There is no transaction
 // and no waiting for a lock: what is locked fails.
 
+#include <cstddef>
 #include <cstdint>
 #include <memory>
 #include <string_view>
@@ -33,11 +34,12 @@ class NetworkStatement {
     // Parameters count from 1. A bind that fails makes the steps that follow fail.
     bool bind(int parameter, std::int32_t value) { return note(bind_result(parameter, value)); }
     bool bind(int parameter, std::string_view text) { return note(bind_result(parameter, text)); }
-    bool bind_null(int parameter);
+    bool bind_null(int parameter) { return note(bind_result(parameter, nullptr)); }
 
     // The same with SQLite's own result, for those who tell it.
     int bind_result(int parameter, std::int32_t value);
     int bind_result(int parameter, std::string_view text);
+    int bind_result(int parameter, std::nullptr_t null);
 
     NetworkStep step();
     // Steps a statement without rows; whether it ran to completion.

@@ -82,12 +82,13 @@ int zel_svc_record_count_up(ZelSvcDataGroup group, const char *section) {
     return number;
 }
 
-void zel_svc_field_compare(std::string_view item, const FieldReport &report, std::string_view spec,
-                           std::string_view phone) {
-    if (report.label.empty() || !wants_line(report.when, spec, phone)) return;
+std::optional<bool> zel_svc_field_compare(std::string_view item, const FieldReport &report, std::string_view spec,
+                                          std::string_view phone) {
+    if (report.label.empty() || !wants_line(report.when, spec, phone)) return std::nullopt;
     std::string label{item};
     if (!item.empty()) label += '/';
     label += report.label;
     const bool passes = spec == phone || (report.passes && report.passes(spec, phone));
     zel_svc_verification_add_compared(label, spec, phone, passes);
+    return passes;
 }

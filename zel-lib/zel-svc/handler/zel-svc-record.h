@@ -198,9 +198,9 @@ void zel_svc_record_load(ZelSvcDataGroup group, const char *section, std::span<c
 int zel_svc_record_count_up(ZelSvcDataGroup group, const char *section);
 
 // Adds the line "[item/label] Spec='...',Phone='...'" of one field, when its rules want one; an empty item
-// leaves "[label]".
-void zel_svc_field_compare(std::string_view item, const FieldReport &report, std::string_view spec,
-                           std::string_view phone);
+// leaves "[label]". Whether it passed; nothing without a line.
+std::optional<bool> zel_svc_field_compare(std::string_view item, const FieldReport &report, std::string_view spec,
+                                          std::string_view phone);
 
 template <class R>
 void zel_svc_record_compare(std::string_view item, std::span<const Field<R>> fields, R &spec, R &phone) {
