@@ -1,6 +1,7 @@
 // What `zel summary` says of the options that the section store keeps.
 
 #include "program.h"
+#include "support/sqlite-file.h"
 
 using namespace zel_test;
 
@@ -102,4 +103,57 @@ TEST_F(ZelSummary, LocksAreShownOnceTheyWereAskedFor) {
     ASSERT_EQ(records_of("SIM locks: networks").size(), 1U);
     EXPECT_EQ(records_of("SIM locks: networks")[0]["value"], "2");
     EXPECT_EQ(records_of("SIM locks: attempts to unlock")[0]["value"], "10");
+}
+
+namespace {
+
+struct NetworkSummary : ZelSummary {
+    void fill(const std::string &sql) const {
+        const SqliteFile networks{root() + "/opt/dbspace/.dnet.db"};
+        networks.run(sql);
+    }
+    static std::string profile(int id, const std::string &name, int network, int category, int is_default) {
+        return "insert into pdp_profile(profile_id, profile_name, apn, network_info_id, svc_category_id, "
+               "default_internet_con) values(" +
+               std::to_string(id) + ", '" + name + "', 'apn" + std::to_string(id) + "', " + std::to_string(network) +
+               ", " + std::to_string(category) + ", " + std::to_string(is_default) + ");";
+    }
+};
+
+} // namespace
+
+TEST_F(NetworkSummary, ShowsEachNetworksProfilesOnceItsDefaultsFirst) {
+    fill("insert into network_info values(1, 'One', '26201'), (2, 'One', '26202'), (3, 'Two', '26203');" +
+         profile(1, "Other", 3, 1, 0) + profile(2, "Web", 3, 1, 1) + profile(3, "Pictures", 3, 2, 1) +
+         profile(4, "Emergency", 3, 6, 1) + profile(5, "Last", 3, 0, 0));
+    EXPECT_NE(run_zel({"summary"})
+                  .out.find("\nNetworks (MCC+MNC) and their profiles (APN), SIM 1\n"
+                            "  One          26201 26202\n"
+                            "  Two          26203\n"
+                            "    Web        apn2         internet        default\n"
+                            "    Pictures   apn3         MMS             default\n"
+                            "    Emergency  apn4         emergency call  default\n"
+                            "    Other      apn1         internet\n"
+                            "    +1 more\n"),
+              std::string::npos)
+        << run_zel({"summary"}).out;
+    EXPECT_EQ(json_of({"summary"})["sims"][0]["networks"][2]["profiles"].size(), 5U);
+}
+
+TEST_F(NetworkSummary, NetworksOfOneNameWithOtherProfilesStandApart) {
+    fill("insert into network_info values(1, 'One', '26201'), (2, 'One', '26202'), (3, 'One', '26203');" +
+         profile(1, "Web", 2, 1, 1));
+    EXPECT_NE(run_zel({"summary"})
+                  .out.find("  One    26201 26203\n"
+                            "  One    26202\n"
+                            "    Web  apn1         internet  default\n"),
+              std::string::npos)
+        << run_zel({"summary"}).out;
+}
+
+TEST_F(NetworkSummary, LongNamesAreShortenedAtAWholeCharacter) {
+    fill("insert into network_info values(1, 'One', '26201');" +
+         profile(1, std::string(32, 'n') + "\xC3\xA9" + std::string(9, 'x'), 1, 1, 0));
+    EXPECT_NE(run_zel({"summary"}).out.find(std::string(32, 'n') + "...  apn1"), std::string::npos)
+        << run_zel({"summary"}).out;
 }

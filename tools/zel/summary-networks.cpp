@@ -57,7 +57,7 @@ const char *service_name(int category) {
     case 5:
         return "tethering";
     case 6:
-        return "e-mail";
+        return "emergency call";
     case 7:
         return "XCAP";
     default:

@@ -3,6 +3,7 @@
 #include "secrets.h"
 
 #include <algorithm>
+#include <base/zel-svc-text.h>
 
 namespace zel_command {
 namespace {
@@ -52,9 +53,9 @@ void print_records(const Json &records) {
     print_table({}, rows);
 }
 
-// An operator has up to dozens of MCC+MNC with the same profiles: the page shows the first few, and the
-// profiles once.
-constexpr std::size_t kShownCodes = 6;
+// An operator has up to dozens of MCC+MNC, most of them with the same profiles: the page shows the first few,
+// and the profiles once.
+constexpr std::size_t kShownCodes = 4;
 
 struct NamedNetwork {
     std::string name;
@@ -62,15 +63,15 @@ struct NamedNetwork {
     Json profiles;
 };
 
-std::vector<NamedNetwork> by_name(const Json &networks) {
+std::vector<NamedNetwork> by_name_and_profiles(const Json &networks) {
     std::vector<NamedNetwork> result;
     for (const Json &network : networks) {
         const std::string name = bytes_of(network, "name");
-        auto found =
-            std::find_if(result.begin(), result.end(), [&](const NamedNetwork &known) { return known.name == name; });
-        if (found == result.end()) found = result.insert(result.end(), {name, {}, Json::array()});
+        auto found = std::find_if(result.begin(), result.end(), [&](const NamedNetwork &known) {
+            return known.name == name && known.profiles == network["profiles"];
+        });
+        if (found == result.end()) found = result.insert(result.end(), {name, {}, network["profiles"]});
         found->codes.push_back(bytes_of(network, "mccmnc"));
-        if (found->profiles.empty()) found->profiles = network["profiles"];
     }
     return result;
 }
@@ -82,14 +83,38 @@ std::string codes_text(const std::vector<std::string> &codes) {
     return codes.size() <= kShownCodes ? result : result + " +" + std::to_string(codes.size() - kShownCodes) + " more";
 }
 
+constexpr std::size_t kShownProfiles = 4;
+constexpr std::size_t kShownName = 36;
+
+std::string shortened(const std::string &text) {
+    return text.size() <= kShownName ? text : text.substr(0, zel_svc_text_cut(text, kShownName - 3)) + "...";
+}
+
+// The defaults of the services, which is what data goes through, before the others.
+std::vector<Json> defaults_first(const Json &profiles) {
+    std::vector<Json> result(profiles.begin(), profiles.end());
+    std::stable_partition(result.begin(), result.end(),
+                          [](const Json &profile) { return profile.value("default", false); });
+    return result;
+}
+
+void add_profiles(std::vector<std::vector<std::string>> &rows, const Json &profiles) {
+    std::size_t shown = 0;
+    for (const Json &profile : defaults_first(profiles)) {
+        if (shown == kShownProfiles) break;
+        rows.push_back({"    " + shortened(bytes_of(profile, "name")), shortened(bytes_of(profile, "apn")),
+                        bytes_of(profile, "service"), profile.value("default", false) ? "default" : ""});
+        ++shown;
+    }
+    if (profiles.size() > shown) rows.push_back({"    +" + std::to_string(profiles.size() - shown) + " more"});
+}
+
 void print_networks(const Json &sims) {
     for (const Json &sim : sims) {
         std::vector<std::vector<std::string>> rows;
-        for (const NamedNetwork &network : by_name(sim["networks"])) {
+        for (const NamedNetwork &network : by_name_and_profiles(sim["networks"])) {
             rows.push_back({"  " + network.name, codes_text(network.codes)});
-            for (const Json &profile : network.profiles)
-                rows.push_back({"    " + bytes_of(profile, "name"), bytes_of(profile, "apn"),
-                                bytes_of(profile, "service"), profile.value("default", false) ? "default" : ""});
+            add_profiles(rows, network.profiles);
         }
         if (rows.empty()) continue;
         print_title("Networks (MCC+MNC) and their profiles (APN), SIM " + sim["sim"].dump());
