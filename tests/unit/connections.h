@@ -13,6 +13,7 @@
 #include "support/spec-text.h"
 #include "support/sqlite-file.h"
 
+#include <filesystem>
 #include <memory>
 
 namespace zel_test {
@@ -72,6 +73,16 @@ class ConnectionPhone : public BenchPhone {
     }
     [[nodiscard]] std::optional<std::string> mirrored(const std::string &key) const {
         return recorded("connection", key);
+    }
+
+    // Descriptors of this process on the network databases: none between two calls.
+    [[nodiscard]] static std::size_t open_databases() {
+        std::size_t count = 0;
+        std::error_code error;
+        for (const auto &entry : std::filesystem::directory_iterator{"/proc/self/fd"})
+            if (std::filesystem::read_symlink(entry.path(), error).string().find("/opt/dbspace/") != std::string::npos)
+                ++count;
+        return count;
     }
 
   private:
