@@ -3,6 +3,8 @@
 #include "connections.h"
 #include "failing-binds.h"
 
+#include "zel-svc-element-act-connection-profile.h"
+
 #include <filesystem>
 #include <gmock/gmock.h>
 #include <regex>
@@ -255,19 +257,44 @@ TEST_F(ConnectionFaults, DefaultOfADatabaseThatDoesNotOpenAgainIsNone) {
     }
 }
 
-TEST_F(ConnectionFaults, EachConnectionThatFailsOnceCostsOneProfileAtMost) {
-    for (const char *function : {"db_util_open", "sqlite3_prepare_v2", "disk_full"})
-        for (int from = 1; from <= 3; ++from) {
+// The insert's connection and the network's: the profile is left out, the next one is not.
+TEST_F(ConnectionFaults, ConnectionThatFailsOnceCostsOneProfile) {
+    for (const char *function : {"db_util_open", "sqlite3_prepare_v2"})
+        for (const int from : {2, 3}) {
             const LoadedGroup fresh{ZEL_SVC_DATA_CONNECTION};
             run("delete from pdp_profile; delete from network_info");
             call("fault-clear");
             fail(function, kPath, from, 1);
             install_two();
-            const SqliteRows written = profiles("profile_name");
-            EXPECT_GE(written.size(), 1U) << function << from;
-            EXPECT_EQ(mirrored("count"), std::to_string(written.size())) << function << from;
+            EXPECT_EQ(profiles("profile_name"), (SqliteRows{{"Mail"}})) << function << from;
+            EXPECT_EQ(mirrored("count"), "1") << function << from;
+            EXPECT_EQ(recorded("spec", "profile_id_1"), std::nullopt);
+            EXPECT_EQ(recorded("spec", "profile_id_2"), "1");
             EXPECT_EQ(open_databases(), 0U);
         }
+}
+
+TEST_F(ConnectionFaults, FullDiskLeavesOnlyWhatIsWhole) {
+    run("insert into network_info values(7, 'One', '26201')");
+    run("create table filler(text); insert into filler values(zeroblob(20000))");
+    fail("disk_full", kPath);
+    std::string many;
+    for (int i = 0; i < 60; ++i)
+        many += profile("One", std::string(150, 'n'), tag("APN", std::string(190, 'a')));
+    install_connections(many);
+    const auto written = static_cast<int>(profiles("*").size());
+    EXPECT_LT(written, 60);
+    EXPECT_EQ(mirrored("count").value_or("0"), std::to_string(written));
+    EXPECT_EQ(rows("pragma integrity_check"), (SqliteRows{{"ok"}}));
+    EXPECT_EQ(open_databases(), 0U);
+}
+
+// The second try drops what the first profile has become in the meantime.
+TEST_F(ConnectionFaults, CleaningThatIsTriedAgainDropsTheProfileBeforeIt) {
+    fail("db_util_open", kPath, 1, 1);
+    install_two();
+    EXPECT_EQ(profiles("profile_name"), (SqliteRows{{"Mail"}}));
+    EXPECT_EQ(mirrored("count"), "2");
 }
 
 TEST_F(ConnectionFaults, CleaningGivesItsResult) {
@@ -278,6 +305,12 @@ TEST_F(ConnectionFaults, CleaningGivesItsResult) {
     EXPECT_EQ(profiles("profile_id"), (SqliteRows{{"1"}, {"2"}, {"3"}}));
     install_connections(profile("One", "Web"));
     EXPECT_EQ(profiles("profile_id"), (SqliteRows{{"2"}, {"3"}}));
+    call("fault-clear");
+    EXPECT_TRUE(__zel_svc_connection_delete_operator_profiles("26201"));
+    EXPECT_EQ(profiles("profile_id"), (SqliteRows{{"2"}}));
+    EXPECT_TRUE(__zel_svc_connection_delete_operator_profiles("no such"));
+    run("drop table pdp_profile");
+    EXPECT_FALSE(__zel_svc_connection_delete_operator_profiles("26201"));
 }
 
 TEST_F(ConnectionFaults, NothingElseIsLogged) {

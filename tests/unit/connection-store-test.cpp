@@ -1,4 +1,4 @@
-// Which rows a profile becomes: networks, modes, the operator's earlier profiles, services and defaults.
+// Which rows a profile becomes: networks, modes and the operator's earlier profiles.
 
 #include "connections.h"
 
@@ -10,10 +10,8 @@ using testing::IsEmpty;
 
 namespace {
 
-const std::string kWeb = tag("ProfBrowser", "Web");
 constexpr const char *kWhose = "profile_name, (select network_name || '/' || mccmnc from network_info where "
                                "network_info.network_info_id = pdp_profile.network_info_id)";
-constexpr const char *kService = "profile_name, svc_category_id, default_internet_con";
 
 } // namespace
 
@@ -90,9 +88,9 @@ TEST_F(ConnectionStore, NoIdFollowsTheLargestInteger) {
     add_network("One", "26201");
     install_connections(profile("One", "Web") + profile("One", "Mail"));
     EXPECT_EQ(profiles("profile_id, profile_name"), (SqliteRows{{"2147483646", "Old"}, {"2147483647", "Web"}}));
-    run("update pdp_profile set profile_id=4294967296 where profile_id=2147483647");
+    run("update pdp_profile set profile_id=4294967296 where profile_id=2147483646");
     install_connections(profile("One", "Mail"));
-    EXPECT_EQ(profiles("profile_id"), (SqliteRows{{"2147483646"}}));
+    EXPECT_EQ(profiles("profile_id, profile_name"), (SqliteRows{{"4294967296", "Old"}}));
 }
 
 TEST_F(ConnectionStore, SpecIndexFindsEachSpecProfilesLastRow) {
@@ -128,13 +126,13 @@ TEST_F(ConnectionStore, OperatorsEarlierProfilesAreReplaced) {
     run("insert into network_info values(7, 'One', '26201'), (8, 'Two', '26202'), (9, 'Too', '26201')");
     put_profile(1, "Old", 7, false);
     put_profile(2, "Older", 9, false);
-    put_profile(3, "The user's", 7, true);
-    put_profile(4, "Two's", 8, false);
-    put_profile(5, "Nobody's", 10, false);
+    put_profile(3, "The users", 7, true);
+    put_profile(4, "Of Two", 8, false);
+    put_profile(5, "Lost", 10, false);
     add_network("One", "26201");
     add_network("Two", "26202");
     install_connections(profile("One", "New") + profile("One", "Newer"));
-    EXPECT_EQ(profiles("profile_name"), (SqliteRows{{"The user's"}, {"Two's"}, {"Nobody's"}, {"New"}, {"Newer"}}));
+    EXPECT_EQ(profiles("profile_name"), (SqliteRows{{"The users"}, {"Of Two"}, {"Lost"}, {"New"}, {"Newer"}}));
 }
 
 TEST_F(ConnectionStore, TheNextInstallReplacesThemAgain) {
@@ -153,6 +151,14 @@ TEST_F(ConnectionStore, ProfilesWithoutConnectionsGoOnWhereTheLastOnesEnded) {
     install_spec(profile("One", "Second"));
     EXPECT_EQ(profiles("profile_name"), (SqliteRows{{"First"}, {"Second"}}));
     EXPECT_EQ(recorded("spec", "profile_id_2"), "2");
+}
+
+TEST_F(ConnectionStore, OnlyAnInstallForgetsWhatItHasCleaned) {
+    add_network("One", "26201");
+    install_connections(profile("One", "First"));
+    verify_spec(connections(""));
+    install_spec(profile("One", "Second"));
+    EXPECT_EQ(profiles("profile_name"), (SqliteRows{{"First"}, {"Second"}}));
 }
 
 TEST_F(ConnectionStore, CleaningThatFailedIsTriedAgain) {
@@ -226,98 +232,6 @@ TEST_F(ConnectionStore, OtherModesInstallNone) {
     set_auto_flag(ZEL_SVC_AUTO_PROFILE, 0);
     install_spec(profile("One", "Web"));
     EXPECT_EQ(recorded("spec", "count"), "1"); // nor were they counted
-}
-
-TEST_F(ConnectionStore, HandlesGiveEachProfileItsService) {
-    add_network("One", "26201");
-    install_connections(handle("One", tag("ProfBrowser", "Web") + tag("ProfMMS", "Pictures") +
-                                          tag("ProfIntSharing", "Share") + tag("ProfIMS", "Calls") +
-                                          tag("ProfXCAP", "Services") + tag("ProfEmergencyIMSCall", "Emergency")) +
-                        profile("One", "Emergency") + profile("One", "Services") + profile("One", "Calls") +
-                        profile("One", "Share") + profile("One", "Pictures") + profile("One", "Web") +
-                        profile("One", "Other") + profile("One", "web"));
-    EXPECT_EQ(profiles(kService), (SqliteRows{{"Emergency", "6", "1"},
-                                              {"Services", "7", "1"},
-                                              {"Calls", "0", "1"},
-                                              {"Share", "5", "1"},
-                                              {"Pictures", "2", "1"},
-                                              {"Web", "1", "1"},
-                                              {"Other", "1", "0"},
-                                              {"web", "1", "0"}}));
-}
-
-TEST_F(ConnectionStore, FirstServiceOfAHandleDecides) {
-    add_network("One", "26201");
-    const std::vector<std::pair<std::string, std::string>> services{
-        {"ProfBrowser", "1"}, {"ProfMMS", "2"},  {"ProfIntSharing", "5"},
-        {"ProfIMS", "0"},     {"ProfXCAP", "7"}, {"ProfEmergencyIMSCall", "6"}};
-    for (std::size_t first = 0; first < services.size(); ++first) {
-        std::string names;
-        for (std::size_t i = services.size(); i-- > first;)
-            names += tag(services[i].first, "Web");
-        install_connections(handle("One", names) + profile("One", "Web"));
-        EXPECT_EQ(profiles("svc_category_id, default_internet_con"), (SqliteRows{{services[first].second, "1"}}));
-    }
-}
-
-TEST_F(ConnectionStore, FirstProfileOfAServiceIsItsDefault) {
-    add_network("One", "26201");
-    add_network("Two", "26202");
-    install_connections(handle("One", kWeb) + handle("Two", kWeb) + profile("One", "Other") + profile("One", "Web") +
-                        profile("One", "Web") + profile("Two", "Web"));
-    EXPECT_EQ(profiles(kService),
-              (SqliteRows{{"Other", "1", "0"}, {"Web", "1", "1"}, {"Web", "1", "0"}, {"Web", "1", "1"}}));
-}
-
-TEST_F(ConnectionStore, UsersDefaultIsKept) {
-    run("insert into network_info values(7, 'One', '26201')");
-    put_profile(1, "Mine", 7, true);
-    add_network("One", "26201");
-    install_connections(handle("One", kWeb + tag("ProfMMS", "Pictures")) + profile("One", "Web") +
-                        profile("One", "Pictures"));
-    EXPECT_EQ(profiles(kService), (SqliteRows{{"Mine", "1", "1"}, {"Web", "1", "0"}, {"Pictures", "2", "1"}}));
-}
-
-TEST_F(ConnectionStore, DefaultsBelowOneAndNullsAreNone) {
-    run("insert into network_info values(7, 'One', '26201')");
-    put_profile(1, "Mine", 7, true);
-    add_network("One", "26201");
-    for (const char *held : {"0", "-3", "null"}) {
-        run("update pdp_profile set default_internet_con=" + std::string{held} + " where profile_id=1");
-        install_connections(handle("One", kWeb) + profile("One", "Web"));
-        EXPECT_EQ(rows("select default_internet_con from pdp_profile where profile_name='Web'"), (SqliteRows{{"1"}}))
-            << held;
-    }
-}
-
-TEST_F(ConnectionStore, SimsProfilesAreDefaultsAtOnce) {
-    use_sim_profiles();
-    set_operator("One", "26201");
-    install_connections(handle("One", kWeb) + profile("One", "Web") + profile("One", "Web") + profile("One", "Other"),
-                        ZEL_SVC_PARSE_MODE_OPERATOR);
-    EXPECT_EQ(profiles(kService), (SqliteRows{{"Web", "1", "1"}, {"Web", "1", "1"}, {"Other", "1", "0"}}));
-}
-
-TEST_F(ConnectionStore, NamelessProfileIsNobodysDefault) {
-    add_network("One", "26201");
-    install_connections(handle("One", kWeb) + tag("Profile", tag("NetworkName", "One") + tag("APN", "web")));
-    EXPECT_EQ(profiles(kService), (SqliteRows{{"", "1", "0"}}));
-}
-
-TEST_F(ConnectionStore, HandlesServeTheirOwnNetworkOnly) {
-    add_network("One", "26201");
-    add_network("Two", "26202");
-    install_connections(handle("Two", kWeb) + handle("default", tag("ProfMMS", "Web")) +
-                        handle("", tag("ProfIMS", "Web")) + profile("default", "Web"));
-    EXPECT_EQ(profiles(kService), (SqliteRows{{"Web", "1", "0"}, {"Web", "1", "1"}}));
-}
-
-TEST_F(ConnectionStore, HandleWithoutANameServesTheNetworkWithoutAName) {
-    add_network("", "26201");
-    add_network("default", "26202");
-    install_connections(tag("ProfileHandle", tag("ProfMMS", "Web")) + handle("default", tag("ProfIMS", "Web")) +
-                        profile("default", "Web"));
-    EXPECT_EQ(profiles(kService), (SqliteRows{{"Web", "2", "1"}, {"Web", "0", "1"}}));
 }
 
 TEST_F(ConnectionStore, ProfileLeftOpenIsDroppedByTheNext) {
