@@ -98,6 +98,22 @@ TEST_F(Bookmark, WithoutAnyTextIsMadeAllTheSame) {
     EXPECT_EQ(group.number("bookmark", "editable_1"), 1);
 }
 
+TEST_F(Bookmark, StartInsideOfAnotherDropsTheOuter) {
+    const LoadedGroup group{ZEL_SVC_DATA_BOOKMARK};
+    install_spec(leaf("Bookmark", leaf("BookmarkName", "outer") + leaf("Bookmark", leaf("BookmarkName", "inner")) +
+                                      leaf("BookmarkName", "late")));
+    EXPECT_THAT(shown_bookmarks(), ElementsAre("inner"));
+    EXPECT_EQ(recorded(group, "count"), "1");
+}
+
+TEST_F(Bookmark, LeftOpenByABrokenDocumentIsDroppedByTheNext) {
+    const LoadedGroup group{ZEL_SVC_DATA_BOOKMARK};
+    install_spec("<Bookmark><BookmarkName>half</BookmarkName><URL>http://half</URL><");
+    install_spec(leaf("BookmarkName", "outside of any") + bookmark("", "", "", "whole", ""));
+    ASSERT_THAT(shown_bookmarks(), ElementsAre("whole"));
+    EXPECT_EQ(bookmarks()[0].at("url"), "");
+}
+
 TEST_F(Bookmark, TextsAreCutToTheirFields) {
     const LoadedGroup group{ZEL_SVC_DATA_BOOKMARK};
     const std::string text(250, 'x');

@@ -299,6 +299,15 @@ TEST_F(DataSync, AgentIsLetGoWhenTheDocumentEndedInside) {
     expect_services_closed();
 }
 
+TEST_F(DataSync, StartInsideOfAnotherDropsTheOuter) {
+    const LoadedGroup group{ZEL_SVC_DATA_SYNCML_DS};
+    install_spec(syncml(leaf("DataSync", leaf("AccName", "outer") + leaf("ServAddr", "http://outer") +
+                                             leaf("DataSync", leaf("AccName", "inner")))));
+    EXPECT_THAT(account_names(), ElementsAre("inner"));
+    EXPECT_EQ(accounts()[0].at("address"), "");
+    EXPECT_EQ(recorded(group, "count"), "1");
+}
+
 TEST_F(DataSync, AgentIsUsedOnceAtATime) {
     install_spec(syncml(syncml("")));
     EXPECT_EQ(calls_of("sync_agent_ds_init"), 2);

@@ -139,6 +139,14 @@ TEST_F(QuickAccess, ExportShowsOtherNumbersAsNothing) {
     EXPECT_EQ(export_value(ZEL_SVC_ELEMENT_NB_QUICK_ACCESS), "0");
 }
 
+TEST_F(QuickAccess, StartInsideOfAnotherDropsTheOuter) {
+    const LoadedGroup group{ZEL_SVC_DATA_QUICK_ACCESS};
+    install_spec(leaf("QuickAccess", leaf("QATitle", "outer") + leaf("QuickAccess", leaf("QAURL", "http://inner"))));
+    EXPECT_EQ(recorded(group, "count"), "1");
+    EXPECT_EQ(recorded(group, "title_1"), "");
+    EXPECT_EQ(recorded(group, "url_1"), "http://inner");
+}
+
 TEST_F(QuickAccess, ValueOutsideOfAnEntryIsIgnored) {
     const LoadedGroup group{ZEL_SVC_DATA_QUICK_ACCESS};
     install_spec(leaf("QATitle", "lost"));
