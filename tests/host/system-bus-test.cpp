@@ -3,12 +3,36 @@
 #include "support/bench-phone.h"
 #include "support/phone-bus.h"
 
+#include <cstddef>
 #include <cstdlib>
+#include <cstring>
 #include <dbus/dbus.h>
 #include <gmock/gmock.h>
-#include <sys/wait.h>
+#include <sys/socket.h>
+#include <sys/syscall.h>
+#include <sys/un.h>
 #include <unistd.h>
 #include <vconf.h>
+
+namespace {
+
+// Where this program tried to connect to, whether or not somebody listened there.
+std::vector<std::string> &tried() {
+    static std::vector<std::string> paths;
+    return paths;
+}
+
+} // namespace
+
+// Stands before the system's own for every library of this program, the bus library among them.
+extern "C" int connect(int socket, const sockaddr *address, socklen_t size) {
+    if (address->sa_family == AF_UNIX) {
+        const auto *place = reinterpret_cast<const sockaddr_un *>(address);
+        const std::size_t head = offsetof(sockaddr_un, sun_path);
+        tried().emplace_back(place->sun_path, ::strnlen(place->sun_path, size - head));
+    }
+    return static_cast<int>(::syscall(SYS_connect, socket, address, size));
+}
 
 namespace {
 
@@ -46,11 +70,15 @@ TEST_F(SystemBus, IsTheOneInTheRoot) {
     EXPECT_EQ(zel_test::connections_seen(bus.address()), 2); // the daemon and this process
 }
 
-TEST_F(SystemBus, IsNoneWithoutItsSocket) { EXPECT_EQ(call_telephony(), "no bus"); }
+TEST_F(SystemBus, IsNoneWithoutItsSocket) {
+    EXPECT_EQ(call_telephony(), "no bus");
+    EXPECT_THAT(tried(), ElementsAre(root() + "/run/dbus/system_bus_socket"));
+}
 
 TEST_F(SystemBus, IsNoneForAProcessWithoutPhone) {
     ::unsetenv("ZEL_ROOT");
     EXPECT_EQ(call_telephony(), "no bus");
+    EXPECT_THAT(tried(), ElementsAre("/dev/null/no-phone"));
 }
 
 TEST_F(SystemBus, HasNoTelephonyUntilItsDaemonRuns) {
