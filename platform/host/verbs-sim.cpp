@@ -20,7 +20,7 @@ Modem wanted_modem(Phone &phone, const Json &arguments) {
 }
 
 std::string bounded(const Json &arguments, const char *name, std::size_t most) {
-    const std::string text = text_of(arguments, name);
+    std::string text = text_of(arguments, name);
     if (text.size() <= most) return text;
     throw WrongArguments(std::string(name) + " has at most " + std::to_string(most) + " digits");
 }
