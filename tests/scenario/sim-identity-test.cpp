@@ -182,3 +182,11 @@ TEST_F(SimIdentityOfTwoSlots, ALongModemNameIsCutTo99Bytes) {
     call("sim", {{"slot", 2}, {"modem", std::string(99, 'm')}});
     EXPECT_EQ(read(2), 1);
 }
+
+TEST_F(SimIdentityOfTwoSlots, OfALongerModemNameTheFirst99BytesAreAskedFor) {
+    insert(2, "655", "10", "2222222222");
+    call("sim", {{"slot", 2}, {"modem", std::string(98, 'm') + "\xC3\xA9"}});
+    call("journal-start");
+    EXPECT_EQ(read(2), 0);
+    EXPECT_THAT(journal(), Contains("tel_init " + std::string(98, 'm'))); // no half character
+}

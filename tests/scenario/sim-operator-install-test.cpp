@@ -73,6 +73,15 @@ std::string bookmark(const std::string &network_name, const std::string &title) 
     return element("Bookmark",
                    name(network_name) + element("BookmarkName", title) + element("URL", "http://x.example"));
 }
+std::string profile(const std::string &network_name, const std::string &apn) {
+    return element("Profile",
+                   name(network_name) + element("ProfileName", "Web") + element("PSparam", element("APN", apn)));
+}
+std::string connections() {
+    return element("Connections", element("ProfileHandle", name("One") + element("ProfBrowser", "Web")) +
+                                      profile("Two", "two.apn") + profile("One", "one.apn") +
+                                      profile("default", "any.apn"));
+}
 std::string ims(const std::string &network_name, const std::string &joyn) {
     return element("Setting", name(network_name) + element("RCS", element("Joyn", joyn)));
 }
@@ -80,7 +89,7 @@ std::string ims(const std::string &network_name, const std::string &joyn) {
 // Two networks' entries of every group whose entries can be told apart here.
 std::string items_of_both() {
     return voicemail("Two", "22") + voicemail("One", "11") + account("Two", "second") + account("One", "first") +
-           wb_amr("Two", "off") + wb_amr("One", "on") + dormancy("Two", "2") + dormancy("One", "1.5") +
+           wb_amr("Two", "off") + wb_amr("One", "on") + dormancy("Two", "2") + dormancy("One", "1.5") + connections() +
            bookmark("Two", "second") + bookmark("One", "first") + bookmark("default", "all") + max_pdp("Two", "2") +
            max_pdp("One", "7") + element("IMSSetting", ims("Two", "off") + ims("One", "on"));
 }
@@ -201,6 +210,7 @@ TEST_F(OperatorInstall, EachFlagAloneLeavesEverythingElseAlone) {
         {"AutoFastDormancy",
          {"fast-dormancy", "fast_dormancy", "network_info"},
          {"fast-dormancy-2", "2/fast_dormancy", "2/network_info"}},
+        {"AutoProfile", {"connection", "pdp_profile"}, {"connection-2", "2/pdp_profile"}},
         {"AutoMaxPDP", {"max-pdp", "max_pdp"}, {"max-pdp-2", "2/max_pdp"}},
     };
     fill_databases();
@@ -258,6 +268,8 @@ TEST_F(OperatorInstall, TakesTheOperatorsEntriesOnly) {
     EXPECT_EQ(rows(kDatabase, "select network_name, mccmnc from network_info"), (SqliteRows{{"One", "26201"}}));
     EXPECT_EQ(rows(kDatabase, "select lcd_on_timeout from fast_dormancy"), (SqliteRows{{"1500"}}));
     EXPECT_EQ(rows(kDatabase, "select max_pdp_3g from max_pdp"), (SqliteRows{{"7"}}));
+    EXPECT_EQ(rows(kDatabase, "select profile_name, apn, default_internet_con from pdp_profile"),
+              (SqliteRows{{"Web", "one.apn", "1"}}));
     EXPECT_TRUE(system_logged("[AutoSIM] IMS setting / NetworkName='One' information found."));
     for (const char *table : {"network_info", "fast_dormancy", "max_pdp", "pdp_profile"})
         EXPECT_THAT(rows(kDatabase2, std::string{"select * from "} + table), IsEmpty()) << table;
@@ -268,6 +280,7 @@ TEST_F(OperatorInstall, OfTheSecondSlotFillsItsDatabase) {
     install(2);
     EXPECT_EQ(rows(kDatabase2, "select lcd_on_timeout from fast_dormancy"), (SqliteRows{{"1500"}}));
     EXPECT_EQ(rows(kDatabase2, "select max_pdp_3g from max_pdp"), (SqliteRows{{"7"}}));
+    EXPECT_EQ(rows(kDatabase2, "select profile_name, apn from pdp_profile"), (SqliteRows{{"Web", "one.apn"}}));
     for (const char *table : {"network_info", "fast_dormancy", "max_pdp", "pdp_profile"})
         EXPECT_THAT(rows(kDatabase, std::string{"select * from "} + table), IsEmpty()) << table;
     EXPECT_THAT(read(data_path("voice-mail-2")), HasSubstr("11"));
