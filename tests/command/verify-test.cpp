@@ -27,6 +27,10 @@ struct ZelVerify : ZelCommand {
         write("/opt/system/zel/mps/ZEL/Customer/XFV/customer.xml",
               kMark + ("<CustomerData>" + elements) + "</CustomerData>");
     }
+    static std::string content_of(const std::string &path) {
+        std::ifstream file{path, std::ios::binary};
+        return {std::istreambuf_iterator<char>{file}, {}};
+    }
     nlohmann::json json_that_differs(std::vector<std::string> arguments) {
         arguments.emplace_back("--json");
         const Outcome outcome = run_zel(arguments);
@@ -177,13 +181,53 @@ TEST_F(ZelVerify, WarnsWhenThereIsNoRoomForFurtherValues) {
     EXPECT_THAT(outcome.err, HasSubstr("no room for more than 1000 values"));
 }
 
+TEST_F(ZelVerify, MasksPasswordsUntilTheyAreAskedFor) {
+    make_phone("<SyncML><NbDataSync>1</NbDataSync></SyncML>");
+    call("sync-accounts-add", {{"name", "backup"}, {"password", "secret-of-the-phone"}});
+    write_file("<SyncML><NbDataSync>1</NbDataSync><DataSync><AccName>backup</AccName>"
+               "<Password>secret-of-the-package</Password></DataSync></SyncML>");
+    const std::string folder = make_folder();
+    const std::vector<std::string> words{"verify", "--html", folder + "/page.html"};
+    for (const std::vector<std::string> &options : {std::vector<std::string>{}, {"--json"}}) {
+        std::vector<std::string> all = words;
+        all.insert(all.end(), options.begin(), options.end());
+        const Outcome hidden = run_zel(all);
+        EXPECT_EQ(hidden.code, 4);
+        EXPECT_THAT(hidden.out, HasSubstr("SyncML_DS1/Password"));
+        EXPECT_THAT(hidden.out, Not(HasSubstr("secret-of")));
+        EXPECT_THAT(content_of(folder + "/page.html"), Not(HasSubstr("secret-of")));
+        all.emplace_back("--reveal");
+        EXPECT_THAT(run_zel(all).out, HasSubstr("secret-of-the-phone"));
+        EXPECT_THAT(content_of(folder + "/page.html"), HasSubstr("secret-of-the-package"));
+    }
+    remove_folder(folder);
+}
+
+// A lap is two numbers, of which the second lost its sign in print.
+TEST_F(ZelVerify, PageShowsLapsInTheirTrueLength) {
+    make_phone();
+    write("/opt/system/zel-default/output/zel-time-lap.log",
+          "Time lap (Spec) : 2.4294467296 sec\nTime lap (App) : 0.7 sec\nTime lap (Spec(SIM2)/APN) : 1.250000 sec\n"
+          "Time lap (Usr) : 1.5\nTime lap (Usr) : x.5 sec\nTime lap (Usr) : 1.99999999999 sec\nsomething else\n"
+          "Time lap (Set back) : 4294967295.4294467296 sec");
+    const std::string folder = make_folder();
+    EXPECT_EQ(run_zel({"verify", "--html", folder + "/page.html"}).code, 0);
+    const std::string page = content_of(folder + "/page.html");
+    for (const char *lap :
+         {"<span>Spec</span>", "<span>1.500 s</span>", "<span>App</span>", "<span>0.000 s</span>",
+          "<span>Spec(SIM2)/APN</span>", "<span>1.250 s</span>", "<span>Set back</span>", "<span>-1.500 s</span>",
+          "<rect width=\"100.00\"", "<rect width=\"83.33\"", "<rect width=\"0.00\""})
+        EXPECT_THAT(page, HasSubstr(lap));
+    EXPECT_THAT(page, Not(HasSubstr("<span>Usr</span>")));
+    remove_folder(folder);
+}
+
 TEST_F(ZelVerify, PageIsOneFile) {
     make_phone("<GeneralInfo><CountryISO>&lt;b&gt;GB</CountryISO></GeneralInfo>");
     set_string("db/zel/country_iso", "<script>alert(1)</script>");
     const std::string folder = make_folder();
     EXPECT_EQ(run_zel({"verify", "--html", folder + "/page.html"}).code, 4);
-    std::ifstream file{folder + "/page.html", std::ios::binary};
-    const std::string page{std::istreambuf_iterator<char>{file}, {}};
+    const std::string page = content_of(folder + "/page.html");
     EXPECT_THAT(page, StartsWith("<!DOCTYPE html>\n"));
     EXPECT_THAT(page, HasSubstr("<i data-is=\"package\">&lt;b&gt;GB</i><u data-is=\"phone\">"
                                 "&lt;script&gt;alert(1)&lt;/script&gt;</u>"));

@@ -33,6 +33,12 @@ struct Encode : zel_test::BenchPhone {
     }
 };
 
+int gAllowed = 0;
+
+void *allocate_a_few(std::size_t count, std::size_t size) {
+    return gAllowed-- > 0 ? std::calloc(count, size) : nullptr;
+}
+
 } // namespace
 
 TEST_F(Encode, LeavesNoElementOpenAndStartsItsCountsAfresh) {
@@ -46,6 +52,24 @@ TEST_F(Encode, LeavesNoElementOpenAndStartsItsCountsAfresh) {
 }
 
 TEST_F(Encode, RefusesANullDocument) { EXPECT_EQ(zel_svc_spec_encode_xml(nullptr), 0); }
+
+// Each allocation fails once, until one run needs no more.
+TEST_F(Encode, WithoutMemoryForAllOfItIsNoDocument) {
+    const std::string whole = document();
+    int result = 0;
+    int allowed = 0;
+    for (; result == 0; ++allowed) {
+        ASSERT_LT(allowed, 100);
+        gAllowed = allowed;
+        char *bytes = nullptr;
+        result = zel_svc_spec_encode_xml(&bytes, allocate_a_few);
+        const std::unique_ptr<char, decltype(&std::free)> owned{bytes, &std::free};
+        EXPECT_EQ(bytes != nullptr, result == 1);
+        EXPECT_EQ(bytes ? std::string{bytes} : whole, whole);
+        EXPECT_EQ(zel_svc_element_get_current_id(), ZEL_SVC_ELEMENT_NONE);
+    }
+    EXPECT_GT(allowed, 3);
+}
 
 TEST_F(Encode, ItemsFollowTheirCounts) {
     for (const auto &[count, item] : {std::pair{"NbBookmark", "Bookmark"},

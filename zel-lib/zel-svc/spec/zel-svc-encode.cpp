@@ -50,11 +50,11 @@ class Document {
 
 } // namespace
 
-int zel_svc_spec_encode_xml(char **document) {
+int zel_svc_spec_encode_xml(char **document, ZelSvcEncodeText::Allocate allocate) {
     if (!document) return 0;
     geZelSvcParseAction = ZEL_SVC_PARSE_ACTION_ENCODE;
     zel_svc_element_table_init();
-    ZelSvcEncodeText text;
+    ZelSvcEncodeText text{allocate};
     Document{text}.write();
     *document = text.release();
     return *document ? 1 : 0;

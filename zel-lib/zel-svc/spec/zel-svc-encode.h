@@ -7,6 +7,8 @@
 //
 // The caller has loaded the groups of the section store and set the network database and the mode.
 
+#include "spec/zel-svc-encode-text.h"
+
 // Sets the parse action to encode and builds the document; the caller frees it. 0, and a null document, when
 // memory ran out.
-int zel_svc_spec_encode_xml(char **document);
+int zel_svc_spec_encode_xml(char **document, ZelSvcEncodeText::Allocate allocate = std::calloc);
