@@ -8,7 +8,7 @@
 #include <gmock/gmock.h>
 
 #include <filesystem>
-#include <functional>
+#include <regex>
 
 using namespace zel_test;
 using ::testing::ElementsAre;
@@ -77,6 +77,19 @@ TEST_F(VerifyDeviations, EachFailsItsOwnLinesAndNoOther) {
     ASSERT_EQ(lost.size(), 1U);
     EXPECT_THAT(lost[0], ::testing::MatchesRegex("\\[Spec\\]\\[FastDormancy2/TimeOut\\] Spec='[0-9.]+',Phone=''"));
     write(dormancy, whole);
+    EXPECT_THAT(failures(), IsEmpty());
+
+    // A row of the network database: the one that the first profile of the file became.
+    const SqliteFile networks{root() + "/opt/dbspace/.dnet.db"};
+    const std::string connections = read("/opt/system/zel-default/data/zel-default-data-connection.ini");
+    std::smatch row;
+    const std::string recorded = connections.substr(connections.find("[spec]"));
+    ASSERT_TRUE(std::regex_search(recorded, row, std::regex{"profile_id_1 *= *([0-9]+)"}));
+    const std::string where = " where profile_id=" + row[1].str();
+    const std::string apn = networks.rows("select apn from pdp_profile" + where).at(0).at(0);
+    networks.run("update pdp_profile set apn='another'" + where);
+    EXPECT_THAT(failures(), ElementsAre("[Spec][Profile1/APN] Spec='" + apn + "',Phone='another'"));
+    networks.run("update pdp_profile set apn='" + apn + "'" + where);
     EXPECT_THAT(failures(), IsEmpty());
 
     // The bookmark service.
