@@ -59,7 +59,7 @@ TEST_F(Faults, FailEveryFunctionOfTheTable) {
         {"security_server_label_access", [] { return security_server_label_access("/opt", "*"); }},
         {"device_power_request_lock", [] { return device_power_request_lock(1, 0); }},
         {"device_power_release_lock", [] { return device_power_release_lock(1); }},
-        {"zel_platform_command", [] { return zel_platform_command("/usr/bin/pkg"); }},
+        {"zel_platform_command", [] { return zel_platform_command("/usr/bin/pkg -d app"); }},
         {"zel_platform_reboot", [] { return zel_platform_reboot(1); }},
         {"zel_platform_now",
          [] {
