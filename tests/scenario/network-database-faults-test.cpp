@@ -37,6 +37,13 @@ constexpr const char *kCustomer = R"(
     <FastDormancy><NetworkName>North</NetworkName><FastDormancyEnableStatus>off</FastDormancyEnableStatus>
       <LCDStatus>off</LCDStatus><Version>rel8</Version></FastDormancy>
   </Network></Main>
+  <Connections>
+    <NbProfileHandle>1</NbProfileHandle>
+    <ProfileHandle><NetworkName>North</NetworkName><ProfBrowser>Web</ProfBrowser></ProfileHandle>
+    <NbProfile>2</NbProfile>
+    <Profile><NetworkName>default</NetworkName><ProfileName>Web</ProfileName></Profile>
+    <Profile><NetworkName>North</NetworkName><ProfileName>Own</ProfileName></Profile>
+  </Connections>
   <Contact><CLIDigits>8</CLIDigits></Contact>
 </Settings>
 )";
@@ -45,6 +52,9 @@ constexpr const char *kCustomer = R"(
 const SqliteRows kNetworks = {{"1", "North", "00101"}, {"2", "South", "00102"}};
 const SqliteRows kDormancy = {{"0", "1", "2500", "-1", "-1", "-1"}, {"1", "2", "2500", "-1", "-1", "-1"}};
 const SqliteRows kLimits = {{"1", "2", "2"}, {"2", "1", "3"}};
+const SqliteRows kProfiles = {{"1", "Web", "1", "1", "1"}, {"2", "Web", "2", "1", "0"}, {"3", "Own", "1", "1", "0"}};
+constexpr const char *kProfileColumns =
+    "(select profile_id, profile_name, network_info_id, svc_category_id, default_internet_con from pdp_profile)";
 
 class NetworkDatabaseFaults : public zel_test::ServicePhone {
   protected:
@@ -111,6 +121,15 @@ class NetworkDatabaseFaults : public zel_test::ServicePhone {
     void expect_dormancy_recorded(const std::optional<std::string> &count) {
         EXPECT_EQ(recorded("fast-dormancy", "count"), count);
     }
+    void expect_profiles_recorded(const std::optional<std::string> &count) {
+        EXPECT_EQ(recorded("connection", "count"), count);
+    }
+    // What an install of no known network records.
+    void expect_items_of_no_network() {
+        expect_dormancy_recorded("2");
+        expect_limits_recorded("2", "3");
+        expect_profiles_recorded(std::nullopt);
+    }
 };
 
 TEST_F(NetworkDatabaseFaults, NoneOfThem) {
@@ -118,8 +137,10 @@ TEST_F(NetworkDatabaseFaults, NoneOfThem) {
     EXPECT_EQ(rows("network_info"), kNetworks);
     EXPECT_EQ(rows("fast_dormancy"), kDormancy);
     EXPECT_EQ(rows("max_pdp"), kLimits);
+    EXPECT_EQ(rows(kProfileColumns), kProfiles);
     expect_dormancy_recorded("2");
     expect_limits_recorded("2", "3");
+    expect_profiles_recorded("3");
     expect_every_open_is_closed();
 }
 
@@ -128,8 +149,7 @@ TEST_F(NetworkDatabaseFaults, MissingFileIsNotCreated) {
     fs::remove(file());
     install();
     EXPECT_FALSE(exists(kDatabase));
-    expect_dormancy_recorded("2");
-    expect_limits_recorded("2", "3");
+    expect_items_of_no_network();
     EXPECT_EQ(calls("db_util_close"), 0U); // nothing was opened
 }
 
@@ -138,6 +158,7 @@ TEST_F(NetworkDatabaseFaults, FileThatIsNoDatabaseIsLeftAlone) {
     write(kDatabase, bytes);
     install();
     EXPECT_EQ(read(kDatabase), bytes);
+    expect_items_of_no_network();
     expect_every_open_is_closed();
 }
 
@@ -145,6 +166,7 @@ TEST_F(NetworkDatabaseFaults, EmptyFileStaysEmpty) {
     write(kDatabase, "");
     install();
     EXPECT_EQ(read(kDatabase), "");
+    expect_items_of_no_network();
     expect_every_open_is_closed();
 }
 
@@ -154,6 +176,7 @@ TEST_F(NetworkDatabaseFaults, DamagedPagesEndInErrors) {
     write(kDatabase, bytes);
     install();
     EXPECT_EQ(read(kDatabase), bytes);
+    expect_items_of_no_network();
     expect_every_open_is_closed();
 }
 
@@ -162,6 +185,7 @@ TEST_F(NetworkDatabaseFaults, CutFileEndsInErrors) {
     write(kDatabase, bytes);
     install();
     EXPECT_EQ(read(kDatabase), bytes);
+    expect_items_of_no_network();
     expect_every_open_is_closed();
 }
 
@@ -175,8 +199,7 @@ TEST_F(NetworkDatabaseFaults, ReadOnlyDatabaseKeepsWhatItHolds) {
     write(kDatabase, bytes);
     install();
     EXPECT_EQ(read(kDatabase), bytes);
-    expect_dormancy_recorded("2"); // no network was registered, so the items stand for none
-    expect_limits_recorded("2", "3");
+    expect_items_of_no_network();
     expect_every_open_is_closed();
 }
 
@@ -185,7 +208,7 @@ TEST_F(NetworkDatabaseFaults, RefusedOpensAreNotClosed) {
     install();
     EXPECT_THAT(rows("network_info"), IsEmpty());
     EXPECT_EQ(calls("db_util_close"), 0U);
-    expect_limits_recorded("2", "3");
+    expect_items_of_no_network();
 }
 
 // Locks of another program
@@ -209,6 +232,7 @@ TEST_F(LockedNetworkDatabase, FromTheStartGrowsNoRow) {
     }
     for (const char *table : {"network_info", "fast_dormancy", "max_pdp", "pdp_profile"})
         EXPECT_THAT(rows(table), IsEmpty()) << table;
+    expect_items_of_no_network();
     expect_every_open_is_closed();
 }
 
@@ -225,6 +249,7 @@ TEST_F(LockedNetworkDatabase, ForWritingKeepsEveryRowAsItWas) {
     EXPECT_EQ(rows("network_info"), kNetworks);
     EXPECT_EQ(rows("fast_dormancy"), kDormancy);
     EXPECT_EQ(rows("max_pdp"), kLimits);
+    EXPECT_EQ(rows(kProfileColumns), kProfiles);
     expect_every_open_is_closed();
 }
 
@@ -235,6 +260,7 @@ TEST_F(NetworkDatabaseFaults, MissingTableFailsItsOwnItemsOnly) {
     install();
     EXPECT_EQ(rows("network_info"), kNetworks);
     EXPECT_EQ(rows("max_pdp"), kLimits);
+    EXPECT_EQ(rows(kProfileColumns), kProfiles);
     expect_dormancy_recorded(std::nullopt);
     expect_limits_recorded("2", "3");
     expect_every_open_is_closed();
@@ -249,6 +275,15 @@ TEST_F(NetworkDatabaseFaults, MissingLimitsLeaveTheRest) {
     expect_every_open_is_closed();
 }
 
+TEST_F(NetworkDatabaseFaults, MissingProfilesLeaveTheRest) {
+    run("drop table pdp_profile");
+    install();
+    EXPECT_EQ(rows("fast_dormancy"), kDormancy);
+    EXPECT_EQ(rows("max_pdp"), kLimits);
+    expect_profiles_recorded(std::nullopt);
+    expect_every_open_is_closed();
+}
+
 TEST_F(NetworkDatabaseFaults, MissingNetworksLeaveTheOtherTablesEmpty) {
     run("drop table network_info");
     install();
@@ -260,12 +295,15 @@ TEST_F(NetworkDatabaseFaults, MissingNetworksLeaveTheOtherTablesEmpty) {
 TEST_F(NetworkDatabaseFaults, OtherColumnsFailTheirOwnItemsOnly) {
     run("alter table fast_dormancy rename column lcd_off_timeout_rel8 to off8");
     run("alter table max_pdp rename column max_pdp_3g to three");
+    run("alter table pdp_profile rename column profile_enable to enabled");
     install();
     EXPECT_EQ(rows("network_info"), kNetworks);
     EXPECT_THAT(rows("fast_dormancy"), IsEmpty()); // the insert names the column
     EXPECT_THAT(rows("max_pdp"), IsEmpty());
+    EXPECT_THAT(rows("pdp_profile"), IsEmpty());
     expect_dormancy_recorded(std::nullopt);
     expect_limits_recorded(std::nullopt, std::nullopt);
+    expect_profiles_recorded(std::nullopt);
     expect_every_open_is_closed();
 }
 
@@ -282,10 +320,13 @@ TEST_F(NetworkDatabaseFaults, ItemsOfKnownNetworksThatFailAreNotRecorded) {
     install();
     run("create trigger no_dormancy before update on fast_dormancy begin select raise(abort, 'no'); end");
     run("create trigger no_limits before insert on max_pdp begin select raise(abort, 'no'); end");
+    run("create trigger no_profiles before insert on pdp_profile begin select raise(abort, 'no'); end");
     install();
     EXPECT_EQ(rows("network_info"), kNetworks);
     expect_dormancy_recorded(std::nullopt);
     expect_limits_recorded(std::nullopt, std::nullopt);
+    expect_profiles_recorded(std::nullopt);
+    EXPECT_THAT(rows("pdp_profile"), IsEmpty()); // the earlier ones were replaced
     expect_every_open_is_closed();
 }
 
@@ -317,10 +358,15 @@ TEST_F(NetworkDatabaseFaults, FullDiskTakesNoNewRow) {
     run("insert into network_info values(8, 'Old', '00101'), (9, 'Older', '00102')");
     int dormancy = 0;
     int limits = 0;
+    int profiles = 0;
     {
         const SqliteFile database{file()};
         dormancy = fill(database, "fast_dormancy", ", 77, -1, -1, -1, -1");
         limits = fill(database, "max_pdp", ", 77, 3");
+        std::string nulls; // a row of nulls is smaller than any profile's
+        for (int column = 1; column < 26; ++column)
+            nulls += ", null";
+        profiles = fill(database, "pdp_profile", nulls);
     }
     fail("disk_full", kDatabase);
     install();
@@ -328,8 +374,10 @@ TEST_F(NetworkDatabaseFaults, FullDiskTakesNoNewRow) {
     EXPECT_EQ(rows("network_info"), (SqliteRows{{"8", "North", "00101"}, {"9", "South", "00102"}}));
     EXPECT_EQ(rows("fast_dormancy").size(), static_cast<std::size_t>(dormancy));
     EXPECT_EQ(rows("max_pdp").size(), static_cast<std::size_t>(limits));
+    EXPECT_EQ(rows("pdp_profile").size(), static_cast<std::size_t>(profiles));
     expect_dormancy_recorded(std::nullopt);
     expect_limits_recorded(std::nullopt, std::nullopt);
+    expect_profiles_recorded(std::nullopt);
     expect_every_open_is_closed();
 }
 
@@ -339,6 +387,7 @@ TEST_F(NetworkDatabaseFaults, CloseThatFailsChangesNothing) {
     EXPECT_EQ(rows("network_info"), kNetworks);
     EXPECT_EQ(rows("fast_dormancy"), kDormancy);
     EXPECT_EQ(rows("max_pdp"), kLimits);
+    EXPECT_EQ(rows(kProfileColumns), kProfiles);
     expect_every_open_is_closed();
 }
 
