@@ -15,27 +15,32 @@
 #include <zel-svc.h>
 
 #include <algorithm>
-#include <chrono>
 #include <cstdio>
 #include <cstdlib>
+#include <ctime>
 #include <functional>
 #include <string>
 
 namespace zel_bench {
 namespace {
 
-using Clock = std::chrono::steady_clock;
+constexpr int kRounds = 3;
+constexpr int kRoundsBeside = 1; // of what is only shown
 
-constexpr int kRounds = 5;
-constexpr int kRoundsBeside = 2; // of what is only shown
+// Of the processor, the kernel's work included: the phone is in memory, so nothing waits for a disk.
+double processor_seconds() {
+    timespec now{};
+    clock_gettime(CLOCK_PROCESS_CPUTIME_ID, &now);
+    return static_cast<double>(now.tv_sec) + static_cast<double>(now.tv_nsec) * 1e-9;
+}
 
 struct Best {
     double seconds = 1e9;
 
     void run(const std::function<void()> &work) {
-        const auto start = Clock::now();
+        const double start = processor_seconds();
         work();
-        seconds = std::min(seconds, std::chrono::duration<double>(Clock::now() - start).count());
+        seconds = std::min(seconds, processor_seconds() - start);
     }
     [[nodiscard]] double milliseconds() const { return seconds * 1e3; }
 };
@@ -133,7 +138,7 @@ int main(int count, char **arguments) {
     }
     std::setvbuf(stdout, nullptr, _IOLBF, BUFSIZ); // large customers take their time
     const zel_bench::Phone phone;
-    std::puts("\nInstall of many networks and profiles (milliseconds)");
+    std::puts("\nInstall of many networks and profiles (milliseconds of processor time)");
     zel_bench::print_head();
     for (int at = 1; at < count; ++at)
         zel_bench::compare(phone, arguments[at]);
