@@ -133,6 +133,7 @@ TEST_F(ZelSimMatch, SaysWhenThereAreMoreEntriesThanAreRead) {
 TEST_F(ZelSimMatch, NeedsACustomerWithAReadableFile) {
     EXPECT_THAT(run_zel({"sim", "matrix", "CCC"}).err, HasSubstr("/Customer/CCC/customer.xml"));
     EXPECT_EQ(run_zel({"sim", "match", "--mccmnc", "21401", "--customer", "CCC"}).code, 1);
+    EXPECT_THAT(run_zel({"sim", "matrix", "../AAA"}).err, HasSubstr("'../AAA' is no customer's code"));
     write("/opt/system/zel/mps/ZEL/Customer/AAA/customer.xml",
           "\xEF\xBB\xBF<?xml version=\"1.0\"?>\n<CustomerData><Gen");
     EXPECT_THAT(run_zel({"sim", "operators"}).err, HasSubstr("/Customer/AAA/customer.xml:2:"));

@@ -5,6 +5,7 @@
 #include "package-check.h"
 #include "sim-cards.h"
 
+#include <zel-svc-configuration-customer-path.h>
 #include <zel-svc-sim-auto-setting-operators.h>
 
 namespace zel_command {
@@ -45,6 +46,9 @@ void require_readable_files(const Invocation &invocation, const RunWatch &watch)
 CustomerOperators operators_of(const Invocation &invocation, const std::string &customer) {
     const std::string code = customer.empty() ? active_customer_name() : customer;
     if (code.empty()) fail_without_customer(invocation);
+    if (!zel_svc_customer_names_folder(code))
+        throw Failure{kFailed, invocation.command->name + ": '" + code + "' is no customer's code",
+                      "'zel customers' lists those of the package."};
     const RunWatch watch{false};
     CustomerOperators result{code, copy_of(zel_svc_sim_operators_of(code))};
     require_readable_files(invocation, watch);
