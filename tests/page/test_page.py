@@ -47,7 +47,7 @@ class VerifyPage(unittest.TestCase):
         cls.folder = tempfile.mkdtemp(prefix="zel-page-test-")
         cls.root = cls.folder + "/phone"
         for words in (["--root", cls.root, "phone", "create", "--package", str(TOP / "examples/package")],
-                      ["install", "XFV"]):
+                      ["install", "UFN"]):
             done = zel(cls.root, *words)
             assert done.returncode == 0, done.stderr
         cls.good = Path(cls.folder, "good.html")
@@ -110,10 +110,11 @@ class VerifyPage(unittest.TestCase):
         self.assertEqual(self.page(path=self.good).run("document.querySelector('.verdict').textContent"), "OK")
         page = self.page()
         self.assertEqual(page.run("document.querySelector('.verdict').textContent"), "NOT OK")
-        self.assertEqual(page.run("document.title"), "Verification of XFV")
+        self.assertEqual(page.run("document.title"), "Verification of UFN")
         summary = page.run("document.querySelector('dl').innerText")
         self.assertIn("2 of ", summary)
-        self.assertIn("1 of 2 results failed", summary)
+        self.assertIn("Internal name\nTFG", summary)
+        self.assertIn("1 of 3 results failed", summary)
 
     def test_failures_come_first_in_their_groups_and_the_groups_with_them(self) -> None:
         page = self.page()

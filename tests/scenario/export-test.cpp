@@ -45,7 +45,13 @@ TEST_F(Export, OfAFreshPhoneIsADocumentOfEmptyLeaves) {
                                                 "  </Settings>\n"
                                                 "</CustomerData>\n"));
     EXPECT_EQ(document().find('\0'), std::string::npos);
-    EXPECT_EQ(run_log(), "") << "no line of its own";
+}
+
+TEST_F(Export, WritesNoRunLogLineOfItsOwn) {
+    set_string("db/zel/salescode", "BTU");
+    EXPECT_EQ(zel_svc_config_encoding_xml(), 1);
+    EXPECT_THAT(document(), HasSubstr("<SalesCode>BTU</SalesCode>\n"));
+    EXPECT_EQ(run_log(), "");
 }
 
 TEST_F(Export, DocumentHasTheAttributesOfEveryLog) {
@@ -176,4 +182,52 @@ TEST_F(Export, OfRecordedCountsThatNoCustomerHasEndsQuickly) {
     EXPECT_EQ(zel_svc_config_encoding_xml(), 1);
     for (const char *item : {"<MaxPDP>", "<FastDormancy>", "<Profile>", "<QuickAccess>"})
         EXPECT_THAT(document(), Not(HasSubstr(item)));
+}
+
+TEST_F(Export, OfAProfileHasBothOfItsAddresses) {
+    const auto profile = [](const std::string &name, const std::string &first, const std::string &second) {
+        return "<Profile><NetworkName>First</NetworkName><ProfileName>" + name +
+               "</ProfileName><DNS><EnableFlag>on</EnableFlag><IPAddr>" + first + "</IPAddr><IPAddr>" + second +
+               "</IPAddr></DNS></Profile>";
+    };
+    write_customer("BTU", "<GeneralInfo><SalesCode>BTU</SalesCode><NetworkInfo><MCCMNC>00101</MCCMNC>"
+                          "<NetworkName>First</NetworkName></NetworkInfo></GeneralInfo>"
+                          "<Settings><Main><Network></Network></Main><Connections><NbProfile>2</NbProfile>" +
+                              profile("one", "10.0.0.1", "10.0.0.2") + profile("two", "10.0.0.3", "10.0.0.4") +
+                              "</Connections></Settings>");
+    zel_svc_config_install_customer("BTU", ZEL_SVC_INSTALL_CONFIG_MODE);
+    EXPECT_EQ(zel_svc_config_encoding_xml(), 1);
+    EXPECT_THAT(document(), HasSubstr("      <NbProfile>2</NbProfile>\n"));
+    for (const auto &[first, second] : {std::pair{"10.0.0.1", "10.0.0.2"}, {"10.0.0.3", "10.0.0.4"}})
+        EXPECT_THAT(document(), HasSubstr(std::string{"        <DNS>\n"
+                                                      "          <EnableFlag>on</EnableFlag>\n"
+                                                      "          <IPAddr>"} +
+                                          first + "</IPAddr>\n          <IPAddr>" + second +
+                                          "</IPAddr>\n"
+                                          "        </DNS>\n"));
+}
+
+TEST_F(Export, WritesNoItemWhereAServiceHasNone) {
+    zel_svc_config_encoding_xml();
+    EXPECT_THAT(document(), HasSubstr("      <NbBookmark>0</NbBookmark>\n      <NbQuickAccess>0</NbQuickAccess>\n"));
+    EXPECT_THAT(document(), HasSubstr("      <NbDataSync>0</NbDataSync>\n    </SyncML>\n"));
+    call("bookmarks-add", {{"title", "A & B"}, {"url", "http://a.example.com/"}});
+    zel_svc_config_encoding_xml();
+    EXPECT_THAT(document(), HasSubstr("      <NbBookmark>1</NbBookmark>\n"
+                                      "      <Bookmark>\n"
+                                      "        <Editable>yes</Editable>\n"
+                                      "        <Folder></Folder>\n"
+                                      "        <BookmarkName>A &amp; B</BookmarkName>\n"
+                                      "        <URL>http://a.example.com/</URL>\n"
+                                      "      </Bookmark>\n"
+                                      "      <NbQuickAccess>0</NbQuickAccess>\n"));
+}
+
+TEST_F(Export, OfServicesThatRefuseHasTheCountAsUnreadableAndNoItems) {
+    call("bookmarks-add", {{"title", "A"}, {"url", "http://a.example.com/"}});
+    fail("bookmark_zel_initialize");
+    fail("sync_agent_ds_init");
+    EXPECT_EQ(zel_svc_config_encoding_xml(), 1);
+    EXPECT_THAT(document(), HasSubstr("<NbBookmark>?\?</NbBookmark>\n      <NbQuickAccess>"));
+    EXPECT_THAT(document(), HasSubstr("<NbDataSync>?\?</NbDataSync>\n    </SyncML>\n"));
 }
