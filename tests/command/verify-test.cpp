@@ -222,6 +222,20 @@ TEST_F(ZelVerify, PageShowsLapsInTheirTrueLength) {
     remove_folder(folder);
 }
 
+TEST_F(ZelVerify, ShowsWhatAServiceCouldNotTellAsItStands) {
+    make_phone("<Browser><NbBookmark>1</NbBookmark><Bookmark><URL>http://a.example.com/</URL></Bookmark></Browser>");
+    const nlohmann::json value = json_that_differs({"verify", "--failures"})["values"][1];
+    EXPECT_EQ(value["value"], "Bookmark1");
+    EXPECT_EQ(value["expected"], "Reading phone failed");
+    EXPECT_EQ(value["phone"], "");
+    EXPECT_EQ(value["line"], "[Spec][Bookmark1] Reading phone failed");
+    const std::string folder = make_folder();
+    EXPECT_EQ(run_zel({"verify", "--html", folder + "/page.html"}).code, 4);
+    EXPECT_THAT(content_of(folder + "/page.html"),
+                HasSubstr("<span>Bookmark1</span><i>Reading phone failed</i></div>"));
+    remove_folder(folder);
+}
+
 TEST_F(ZelVerify, PageIsOneFile) {
     make_phone("<GeneralInfo><CountryISO>&lt;b&gt;GB</CountryISO></GeneralInfo>");
     set_string("db/zel/country_iso", "<script>alert(1)</script>");

@@ -85,7 +85,8 @@ std::vector<Command> own_commands() {
          .help = "Compare the phone with the active customer's file, and write the report.",
          .more = "Exits 4 when anything differs: a value of the customer's file, a media folder since the install, an "
                  "application's result. Exits 1 without an active customer (--imei counts that as one difference), "
-                 "when its file cannot be read to its end, or when the report cannot be written.\n"
+                 "when its file cannot be read to its end, when there are more values than the library's 1000, or when "
+                 "the report cannot be written.\n"
                  "Passwords are masked, in JSON and on the page too; --reveal shows them.\n"
                  "Writes: \"/opt/system/zel-default/output/zel-verification-report.log\", \"zel-fs-status-verify.ini\" "
                  "beside it, and the keys that 'zel version' writes.",

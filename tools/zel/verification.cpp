@@ -30,6 +30,7 @@ void read_spec_line(VerifiedValue &value, std::string_view text) {
         value.expected = text.substr(std::min(label_end + 2, text.size()));
         return;
     }
+    value.compared = true;
     const std::size_t first = spec + kSpec.size();
     const std::size_t second = phone + kPhone.size();
     value.expected = text.substr(first, phone - first);
@@ -42,6 +43,7 @@ void read_media_line(VerifiedValue &value, std::string_view text) {
     const std::size_t arrow = text.rfind("=>");
     value.label = text.substr(0, blank);
     if (blank == std::string_view::npos || arrow == std::string_view::npos || arrow < blank) return;
+    value.compared = true;
     value.expected = text.substr(blank + 1, arrow - blank - 1);
     value.phone = text.substr(arrow + 2);
 }
@@ -62,7 +64,7 @@ std::string package_version() {
 } // namespace
 
 VerifiedValue verified_value(std::string_view line, bool passed) {
-    VerifiedValue value{VerifiedKind::kSpec, passed, false, std::string{line}, {}, {}, {}};
+    VerifiedValue value{VerifiedKind::kSpec, passed, false, false, std::string{line}, {}, {}, {}};
     if (take(line, "[FS] ")) {
         value.kind = VerifiedKind::kMedia;
         read_media_line(value, line);
@@ -80,7 +82,9 @@ VerifiedValue shown(VerifiedValue value, bool reveal) {
     if (reveal || !value.secret) return value;
     value.expected = masked(value.expected);
     value.phone = masked(value.phone);
-    value.text = "[Spec][" + value.label + "] Spec='" + value.expected + "',Phone='" + value.phone + "'";
+    if (!value.compared) value.text = "[Spec][" + value.label + "] " + value.expected;
+    if (value.compared)
+        value.text = "[Spec][" + value.label + "] Spec='" + value.expected + "',Phone='" + value.phone + "'";
     return value;
 }
 

@@ -19,6 +19,7 @@ struct VerifiedValue {
     VerifiedKind kind;
     bool passed;
     bool secret;          // a password: see secrets.h
+    bool compared;        // has two values
     std::string text;     // the library's line
     std::string label;    // "GPS/GPSActivation", "media/image size", "Customer1"
     std::string expected; // by the package, or after the install; of a line without values its text

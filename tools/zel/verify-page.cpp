@@ -80,9 +80,8 @@ std::string value_row(const VerifiedValue &value, bool reveal) {
     const VerifiedValue seen = shown(value, reveal);
     std::string row = seen.passed ? "<div class=\"value\"><b>pass</b>" : "<div class=\"value failed\"><b>failure</b>";
     row += element("span", in_its_group(seen));
-    const bool compared = seen.kind == VerifiedKind::kSpec;
-    row += element(compared ? "i data-is=\"package\"" : "i", seen.expected);
-    if (compared) row += element("u data-is=\"phone\"", seen.phone);
+    row += element(seen.compared ? "i data-is=\"package\"" : "i", seen.expected);
+    if (seen.compared) row += element("u data-is=\"phone\"", seen.phone);
     return row + "</div>\n";
 }
 
