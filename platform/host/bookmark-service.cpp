@@ -4,11 +4,17 @@
 #include <bookmark.h>
 #include <cstdlib>
 #include <cstring>
+#include <memory>
 
 namespace zel_host {
 namespace {
 
 constexpr int kRefused = -1;
+
+struct Free {
+    void operator()(char *text) const { std::free(text); }
+};
+using OwnedText = std::unique_ptr<char, Free>;
 
 bool &is_client() {
     static bool initialized = false;
@@ -32,11 +38,14 @@ int give_ids(const std::vector<std::int64_t> &found, int **ids, int *count) {
 int give_info(Phone &phone, int id, bookmark_zel_info *info) {
     const std::optional<Bookmark> found = get_bookmark(phone, id);
     if (!found || info == nullptr) return kRefused;
+    OwnedText title{::strdup(found->title.c_str())};
+    OwnedText url{found->folder ? nullptr : ::strdup(found->url.c_str())};
+    if (!title || (!found->folder && !url)) return kRefused;
     *info = {.is_folder = found->folder ? 1 : 0,
              .parent = static_cast<int>(found->parent),
              .editable = found->editable ? 1 : 0,
-             .title = ::strdup(found->title.c_str()),
-             .url = found->folder ? nullptr : ::strdup(found->url.c_str())};
+             .title = title.release(),
+             .url = url.release()};
     return 0;
 }
 
@@ -55,7 +64,9 @@ int create(Phone &phone, const bookmark_zel_info *info, int *id) {
 int give_manual(Phone &phone, char **url) {
     if (url == nullptr) return kRefused;
     const std::string set = user_manual_url(phone);
-    *url = set.empty() ? nullptr : ::strdup(set.c_str());
+    OwnedText copy{set.empty() ? nullptr : ::strdup(set.c_str())};
+    if (!set.empty() && !copy) return kRefused;
+    *url = copy.release();
     return 0;
 }
 

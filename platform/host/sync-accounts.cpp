@@ -75,10 +75,12 @@ std::int64_t add_sync_account(Phone &phone, const SyncAccount &account) {
 }
 
 bool remove_sync_account(Phone &phone, std::int64_t id) {
+    Transaction transaction(phone.store());
     phone.store().query("DELETE FROM sync_service WHERE account = ?").bind(id).run();
     Query query = phone.store().query("DELETE FROM sync_account WHERE id = ? RETURNING 1");
     const bool existed = query.bind(id).row();
     if (existed) query.run();
+    transaction.commit();
     return existed;
 }
 

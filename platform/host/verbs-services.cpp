@@ -119,7 +119,9 @@ Json add_account(Phone &phone, const Json &arguments) {
 }
 
 Json forget_accounts(Phone &phone, const Json & /*arguments*/) {
+    Transaction transaction(phone.store());
     clear_sync_accounts(phone);
+    transaction.commit();
     return Json::object();
 }
 

@@ -76,6 +76,18 @@ TEST(ItemApplies, InstallsEveryNetworksInFullModeAndTheOperatorsInOperatorMode) 
             }
 }
 
+TEST(ItemApplies, DefaultIsEveryOperatorsOnlyWhereTheGroupSaysSo) {
+    set_operator("One");
+    gbZelSvcNetworkAutoFlags.fill(1);
+    const Occurrence end{
+        .kind = OccurrenceKind::End, .action = ZEL_SVC_PARSE_ACTION_INSTALL, .mode = ZEL_SVC_PARSE_MODE_OPERATOR};
+    for (const std::string_view name : {"One", "default"})
+        EXPECT_TRUE(zel_svc_item_applies(end, ZEL_SVC_AUTO_WB_AMR, name, Wildcard::DefaultIsEverybodys)) << name;
+    for (const std::string_view name : {"Two", "Default", ""})
+        EXPECT_FALSE(zel_svc_item_applies(end, ZEL_SVC_AUTO_WB_AMR, name, Wildcard::DefaultIsEverybodys)) << name;
+    EXPECT_FALSE(zel_svc_item_applies(end, ZEL_SVC_AUTO_WB_AMR, "default"));
+}
+
 TEST(ItemApplies, InInstallsOnly) {
     gbZelSvcNetworkAutoFlags.fill(0);
     for (const ZelSvcParseAction action : {ZEL_SVC_PARSE_ACTION_VERIFY, ZEL_SVC_PARSE_ACTION_ENCODE})

@@ -154,6 +154,13 @@ TEST_F(QuickAccess, ValueOutsideOfAnEntryIsIgnored) {
     EXPECT_EQ(recorded(group, "count"), std::nullopt);
 }
 
+TEST_F(QuickAccess, LeftOpenByABrokenDocumentHasNoLineInTheNext) {
+    const LoadedGroup group{ZEL_SVC_DATA_QUICK_ACCESS};
+    install_spec(entry("yes", "Portal", "http://p"));
+    verify_spec("<QuickAccess><QATitle>Portal</QATitle><");
+    EXPECT_THAT(verify_spec(leaf("QATitle", "Portal") + leaf("QAURL", "http://p")), IsEmpty());
+}
+
 class EManual : public ServicesPhone {
   protected:
     static std::string spec(const std::string &url) { return leaf("eManual", leaf("URL", url)); }

@@ -1,23 +1,15 @@
 #include "zel-svc-bookmark-service.h"
 
+#include "base/zel-svc-free.h"
 #include "base/zel-svc-text.h"
 
 #include <bookmark.h>
 
-#include <cstdlib>
-#include <memory>
-
 namespace {
 
-struct Free {
-    void operator()(void *memory) const { std::free(memory); }
-};
-using OwnedText = std::unique_ptr<char, Free>;
-using OwnedIds = std::unique_ptr<int, Free>;
+std::string string_of(const ZelSvcOwnedText &text) { return std::string{zel_svc_text_view(text.get())}; }
 
-std::string string_of(const OwnedText &text) { return std::string{zel_svc_text_view(text.get())}; }
-
-std::vector<int> list_of(const OwnedIds &ids, int count) {
+std::vector<int> list_of(const ZelSvcOwned<int> &ids, int count) {
     if (!ids || count <= 0) return {};
     return {ids.get(), ids.get() + count};
 }
@@ -48,15 +40,15 @@ std::optional<std::vector<int>> BookmarkService::ids() const {
     int *raw = nullptr;
     int count = 0;
     if (bookmark_zel_get_full_ids_p(&raw, &count) != 0) return std::nullopt;
-    const OwnedIds owned{raw};
+    const ZelSvcOwned<int> owned{raw};
     return list_of(owned, count);
 }
 
 std::optional<BookmarkService::Info> BookmarkService::info(int id) const {
     bookmark_zel_info raw{};
     if (bookmark_zel_get_info(id, &raw) != 0) return std::nullopt;
-    const OwnedText title{raw.title};
-    const OwnedText url{raw.url};
+    const ZelSvcOwnedText title{raw.title};
+    const ZelSvcOwnedText url{raw.url};
     return Info{.parent = raw.parent, .editable = raw.editable != 0, .title = string_of(title), .url = string_of(url)};
 }
 
@@ -64,7 +56,7 @@ std::optional<std::vector<int>> BookmarkService::folders_titled(const char *titl
     int *raw = nullptr;
     int count = 0;
     if (bookmark_zel_get_duplicated_title_ids_p(title, parent, 1, &raw, &count) != 0) return std::nullopt;
-    const OwnedIds owned{raw};
+    const ZelSvcOwned<int> owned{raw};
     return list_of(owned, count);
 }
 
@@ -85,7 +77,7 @@ void BookmarkService::reset() const { bookmark_zel_reset(); }
 std::optional<std::string> BookmarkService::manual_url() const {
     char *raw = nullptr;
     if (bookmark_zel_get_user_manual_url(&raw) != 0) return std::nullopt;
-    return string_of(OwnedText{raw});
+    return string_of(ZelSvcOwnedText{raw});
 }
 
 bool BookmarkService::set_manual_url(const char *url) const { return bookmark_zel_set_user_manual_url(url) == 0; }

@@ -2,6 +2,7 @@
 
 #include "base/zel-svc-file-replace.h"
 #include "base/zel-svc-file.h"
+#include "base/zel-svc-free.h"
 #include "base/zel-svc-guard.h"
 #include "spec/zel-svc-data.h"
 #include "spec/zel-svc-encode.h"
@@ -9,30 +10,22 @@
 #include "zel-svc-configuration-recorded-groups.h"
 #include "zel-svc.h"
 
-#include <cstdlib>
-#include <memory>
-
 namespace {
 
 constexpr const char *kDocumentPath = "/opt/system/zel-default/output/customer-phone.xml";
 
-struct FreeText {
-    void operator()(char *text) const { std::free(text); }
-};
-using Document = std::unique_ptr<char, FreeText>;
-
 // Null when memory ran out.
-Document phone_as_document() {
+ZelSvcOwnedText phone_as_document() {
     const ZelSvcRecordedGroups groups;
     zel_svc_set_network_db_path(ZEL_SVC_NETWORK_DB_PATH_SIM1);
     geZelSvcParseMode = ZEL_SVC_PARSE_MODE_HEADER;
     char *document = nullptr;
     zel_svc_spec_encode_xml(&document);
-    return Document{document};
+    return ZelSvcOwnedText{document};
 }
 
 bool write_document() {
-    const Document document = phone_as_document();
+    const ZelSvcOwnedText document = phone_as_document();
     if (!document || !zel_svc_file_replace(kDocumentPath, document.get())) return false;
     zel_svc_file_set_output_attr(kDocumentPath, "*");
     return true;

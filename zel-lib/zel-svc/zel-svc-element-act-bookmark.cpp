@@ -1,9 +1,7 @@
 #include "zel-svc-element-act-bookmark.h"
 
 #include "base/zel-svc-run-log.h"
-#include "handler/zel-svc-applies.h"
-#include "handler/zel-svc-record.h"
-#include "handler/zel-svc-setting.h"
+#include "handler/zel-svc-phone-list.h"
 #include "zel-svc-bookmark-service.h"
 
 namespace {
@@ -18,11 +16,10 @@ struct Bookmark {
 static_assert(sizeof(Bookmark) == 660);
 
 constexpr const char *kSection = "bookmark";
-constexpr Word kYesNo[] = {{"yes", 1}, {"no", 0}};
 
 // Whatever is not "no" means yes, in the service and in the record.
 constexpr FieldRules kEditable{
-    .accepts = words(kYesNo),
+    .accepts = yes_no(),
     .others = FieldOthers::Kept,
     .record = {.key = "editable_%d", .form = FieldForm::Word, .otherwise = 1},
     .report = {.label = "Editable", .when = LineWhen::SpecGiven},
@@ -128,9 +125,9 @@ void create(const BookmarkService &service, Bookmark &bookmark) {
 }
 
 void install(const Occurrence &occurrence, Bookmark &bookmark) {
-    if (!zel_svc_group_applies(occurrence, ZEL_SVC_AUTO_BOOKMARK)) return;
-    const bool anybodys = occurrence.mode == ZEL_SVC_PARSE_MODE_FULL;
-    if (!anybodys && !zel_svc_is_current_operators(bookmark.network_name.view(), Wildcard::DefaultIsEverybodys)) return;
+    if (!zel_svc_item_applies(occurrence, ZEL_SVC_AUTO_BOOKMARK, bookmark.network_name.view(),
+                              Wildcard::DefaultIsEverybodys))
+        return;
     zel_svc_run_log("[Bookmark/Start] Set bookmark.\n");
     BookmarkService service;
     if (!service) return zel_svc_run_log("[Bookmark/Error] Run init().\n");
@@ -143,23 +140,18 @@ void verify(const Occurrence &occurrence, Bookmark &spec) {
     if (!zel_svc_group_applies(occurrence, ZEL_SVC_AUTO_BOOKMARK)) return;
     Bookmark phone;
     const bool read = read_from_phone(gIndex, phone);
-    const std::string item = "Bookmark" + std::to_string(++gIndex);
-    if (read)
-        zel_svc_record_compare<Bookmark>(item, kFields, spec, phone);
-    else
-        zel_svc_verification_add_result("[" + item + "] Reading phone failed", false);
+    zel_svc_phone_list_compare<Bookmark>("Bookmark", ++gIndex, kFields, spec, read ? &phone : nullptr);
 }
 
 } // namespace
+
+void zel_svc_element_act_bookmark_begin_parse() { gBookmark.close(); }
 
 void zel_svc_element_act_bookmark_count(Occurrence &occurrence) {
     if (occurrence.element != ZEL_SVC_ELEMENT_NB_BOOKMARK) return;
     if (occurrence.installs()) return clear_service();
     gIndex = 0;
-    if (occurrence.exports() && occurrence.out) return occurrence.out->assign(count_in_service());
-    if (!zel_svc_group_applies(occurrence, ZEL_SVC_AUTO_BOOKMARK)) return;
-    const std::string phone = count_in_service();
-    zel_svc_setting_add_result("Bookmark", occurrence.tag, occurrence.text, phone, occurrence.text == phone);
+    zel_svc_phone_list_count(occurrence, ZEL_SVC_AUTO_BOOKMARK, "Bookmark", count_in_service);
 }
 
 void zel_svc_element_act_bookmark_start(Occurrence &occurrence) {

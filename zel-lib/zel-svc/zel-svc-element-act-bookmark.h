@@ -8,3 +8,6 @@ void zel_svc_element_act_bookmark_count(Occurrence &occurrence);
 void zel_svc_element_act_bookmark_start(Occurrence &occurrence);
 void zel_svc_element_act_bookmark_value(Occurrence &occurrence);
 void zel_svc_element_act_bookmark_end(Occurrence &occurrence);
+
+// Drops what a parse that ended inside of a bookmark left behind; called when a parse begins.
+void zel_svc_element_act_bookmark_begin_parse();

@@ -4,7 +4,6 @@ namespace {
 
 using Profile = ZelSvcApnProfile;
 
-constexpr Word kYesNo[] = {{"yes", 1}, {"no", 0}};
 constexpr Word kEnableDisable[] = {{"enable", 1}, {"disable", 0}};
 constexpr Word kHiddenShow[] = {{"hidden", 1}, {"show", 0}, {"on", 1}, {"off", 0}};
 constexpr Word kProtocols[] = {{"ipv4", 2}, {"ipv6", 5}, {"ipv4v6", 6}};

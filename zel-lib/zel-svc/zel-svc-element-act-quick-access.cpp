@@ -14,14 +14,12 @@ struct QuickAccess {
 static_assert(sizeof(QuickAccess) == 420);
 
 constexpr const char *kSection = "quickaccess";
-constexpr Word kYesNo[] = {{"yes", 1}, {"no", 0}};
 
 // Only the two words are recorded: the browser decides about anything else.
 constexpr Field<QuickAccess> kFields[] = {
-    field<&QuickAccess::editable>(ZEL_SVC_ELEMENT_QUICK_ACCESS_EDITABLE,
-                                  {.accepts = words(kYesNo),
-                                   .others = FieldOthers::Kept,
-                                   .record = {.key = "editable_%d", .form = FieldForm::Word}}),
+    field<&QuickAccess::editable>(
+        ZEL_SVC_ELEMENT_QUICK_ACCESS_EDITABLE,
+        {.accepts = yes_no(), .others = FieldOthers::Kept, .record = {.key = "editable_%d", .form = FieldForm::Word}}),
     field<&QuickAccess::title>(ZEL_SVC_ELEMENT_QA_TITLE, {.record = {.key = "title_%d"}}),
     field<&QuickAccess::url>(ZEL_SVC_ELEMENT_QA_URL, {.record = {.key = "url_%d"}}),
 };
@@ -34,6 +32,8 @@ void compare(const Occurrence &occurrence, std::string_view spec, std::string_vi
 }
 
 } // namespace
+
+void zel_svc_element_act_quick_access_begin_parse() { gEntry.close(); }
 
 void zel_svc_element_act_quick_access_count(Occurrence &occurrence) {
     if (occurrence.element != ZEL_SVC_ELEMENT_NB_QUICK_ACCESS || occurrence.installs()) return;

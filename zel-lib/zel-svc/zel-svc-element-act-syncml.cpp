@@ -1,9 +1,7 @@
 #include "zel-svc-element-act-syncml.h"
 
 #include "base/zel-svc-run-log.h"
-#include "handler/zel-svc-applies.h"
-#include "handler/zel-svc-record.h"
-#include "handler/zel-svc-setting.h"
+#include "handler/zel-svc-phone-list.h"
 #include "zel-svc-data-sync-account.h"
 #include "zel-svc-sync-agent.h"
 
@@ -91,16 +89,15 @@ void verify(const Occurrence &occurrence, Account &spec) {
     if (!zel_svc_group_applies(occurrence, ZEL_SVC_AUTO_SYNCML)) return;
     Account phone;
     const bool read = read_from_phone(gIndex, phone);
-    const std::string item = "SyncML_DS" + std::to_string(++gIndex);
-    if (read)
-        zel_svc_record_compare<Account>(item, kFields, spec, phone);
-    else
-        zel_svc_verification_add_result("[" + item + "] Reading phone failed", false);
+    zel_svc_phone_list_compare<Account>("SyncML_DS", ++gIndex, kFields, spec, read ? &phone : nullptr);
 }
 
 } // namespace
 
-void zel_svc_element_act_syncml_begin_parse() { close_agent(); }
+void zel_svc_element_act_syncml_begin_parse() {
+    gAccount.close();
+    close_agent();
+}
 
 void zel_svc_element_act_syncml_start(Occurrence &occurrence) {
     if (occurrence.element != ZEL_SVC_ELEMENT_SYNCML) return;
@@ -117,10 +114,7 @@ void zel_svc_element_act_data_sync_count(Occurrence &occurrence) {
     if (occurrence.element != ZEL_SVC_ELEMENT_NB_DATA_SYNC) return;
     if (occurrence.installs() && gReady) clear_agent();
     gIndex = 0;
-    if (occurrence.exports() && occurrence.out) return occurrence.out->assign(count_in_agent());
-    if (!occurrence.verifies() || !zel_svc_group_applies(occurrence, ZEL_SVC_AUTO_SYNCML)) return;
-    const std::string phone = count_in_agent();
-    zel_svc_setting_add_result("SyncML_DS", occurrence.tag, occurrence.text, phone, occurrence.text == phone);
+    zel_svc_phone_list_count(occurrence, ZEL_SVC_AUTO_SYNCML, "SyncML_DS", count_in_agent);
 }
 
 void zel_svc_element_act_data_sync_start(Occurrence &occurrence) {

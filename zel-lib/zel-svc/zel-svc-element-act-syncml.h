@@ -4,7 +4,8 @@
 
 #include "spec/zel-svc-occurrence.h"
 
-// Lets go of an agent that a document left in use by ending inside of its SyncML element.
+// Drops the account and lets go of the agent that a parse left behind by ending inside of their elements; called
+// when a parse begins.
 void zel_svc_element_act_syncml_begin_parse();
 
 void zel_svc_element_act_syncml_start(Occurrence &occurrence);

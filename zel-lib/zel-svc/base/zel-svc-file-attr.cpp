@@ -1,24 +1,20 @@
 #include "base/zel-svc-file-attr.h"
 
+#include "base/zel-svc-free.h"
+
 #include <security-server.h>
 #include <smack.h>
 #include <zel-platform.h>
 
-#include <cstdlib>
-#include <memory>
 #include <sys/stat.h>
 
 namespace {
-
-struct FreeText {
-    void operator()(char *text) const { std::free(text); }
-};
 
 void copy_label(const char *source, const char *target) {
     char *label = nullptr;
     // The label call does not follow links, but what is copied is the file behind them.
     if (smack_lgetlabel(zel_svc_file_behind_links(source).c_str(), &label) != 0) return;
-    const std::unique_ptr<char, FreeText> owned{label};
+    const ZelSvcOwnedText owned{label};
     if (owned) security_server_label_access(target, owned.get());
 }
 

@@ -1,16 +1,16 @@
 #pragma once
 // Strings of the settings store.
 
+#include "base/zel-svc-free.h"
+
 #include <vconf.h>
 
-#include <cstdlib>
-#include <memory>
 #include <optional>
 #include <string>
 
 // The value of a string key; nothing when it cannot be read.
 inline std::optional<std::string> zel_svc_key_text(const char *key) {
-    const std::unique_ptr<char, decltype(&std::free)> value{vconf_get_str(key), &std::free};
+    const ZelSvcOwnedText value{vconf_get_str(key)};
     if (!value) return std::nullopt;
     return std::string{value.get()};
 }

@@ -25,6 +25,7 @@ struct Word {
 };
 
 inline constexpr Word kOnOff[] = {{"on", 1}, {"off", 0}};
+inline constexpr Word kYesNo[] = {{"yes", 1}, {"no", 0}};
 
 struct Accepts {
     enum class Kind { Words, KeptWords, Number, NumberInRange, Volume, Language, AnyText };
@@ -38,6 +39,7 @@ struct Accepts {
 constexpr Accepts words(std::span<const Word> list) { return {.kind = Accepts::Kind::Words, .words = list}; }
 constexpr Accepts kept_words(std::span<const Word> list) { return {.kind = Accepts::Kind::KeptWords, .words = list}; }
 constexpr Accepts on_off() { return words(kOnOff); }
+constexpr Accepts yes_no() { return words(kYesNo); }
 constexpr Accepts any_number() { return {.kind = Accepts::Kind::Number}; }
 constexpr Accepts numbers(std::int32_t minimum, std::int32_t maximum) {
     return {.kind = Accepts::Kind::NumberInRange, .minimum = minimum, .maximum = maximum};

@@ -15,7 +15,8 @@ bool zel_svc_is_current_operators(std::string_view network_name, Wildcard wildca
     return network_name == zel_svc_text_view(current.network_name, sizeof current.network_name);
 }
 
-bool zel_svc_item_applies(const Occurrence &occurrence, ZelSvcAutoFlag flag, std::string_view network_name) {
+bool zel_svc_item_applies(const Occurrence &occurrence, ZelSvcAutoFlag flag, std::string_view network_name,
+                          Wildcard wildcard) {
     if (!occurrence.installs() || !zel_svc_group_applies(occurrence, flag)) return false;
-    return occurrence.mode == ZEL_SVC_PARSE_MODE_FULL || zel_svc_is_current_operators(network_name);
+    return occurrence.mode == ZEL_SVC_PARSE_MODE_FULL || zel_svc_is_current_operators(network_name, wildcard);
 }

@@ -19,7 +19,8 @@ bool zel_svc_is_current_operators(std::string_view network_name, Wildcard wildca
 
 // Install of an item that serves one network: a full install takes it as soon as its group applies, an
 // operator install only when it is the operator's own.
-bool zel_svc_item_applies(const Occurrence &occurrence, ZelSvcAutoFlag flag, std::string_view network_name);
+bool zel_svc_item_applies(const Occurrence &occurrence, ZelSvcAutoFlag flag, std::string_view network_name,
+                          Wildcard wildcard = Wildcard::None);
 
 inline bool zel_svc_is_every_network(std::string_view network_name) {
     return network_name.empty() || network_name == "default";

@@ -1,5 +1,6 @@
 #include "handler/zel-svc-setting.h"
 
+#include "base/zel-svc-key-text.h"
 #include "base/zel-svc-number.h"
 #include "base/zel-svc-observer.h"
 #include "spec/zel-svc-verification.h"
@@ -7,17 +8,11 @@
 #include <vconf.h>
 
 #include <algorithm>
-#include <cstdlib>
 #include <iterator>
-#include <memory>
 
 namespace {
 
 constexpr std::string_view kUnknown = "??";
-
-struct FreeString {
-    void operator()(char *text) const { std::free(text); }
-};
 
 void write_records(const Setting &setting, std::size_t stores_written, std::int32_t value, std::string_view text) {
     const auto used = static_cast<std::size_t>(std::count_if(std::begin(setting.stores), std::end(setting.stores),
@@ -164,9 +159,7 @@ std::optional<std::int32_t> zel_svc_store_number(const Store &store) {
 
 std::optional<std::string> zel_svc_store_text(const Store &store) {
     if (!store.key || store.type != KeyType::String) return std::nullopt;
-    const std::unique_ptr<char, FreeString> text{vconf_get_str(store.key)};
-    if (!text) return std::nullopt;
-    return std::string{text.get()};
+    return zel_svc_key_text(store.key);
 }
 
 void zel_svc_setting_record(const Record &record, std::int32_t value, std::string_view text) {

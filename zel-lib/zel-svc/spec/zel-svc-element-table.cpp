@@ -372,6 +372,8 @@ extern constexpr std::array<ZelSvcElement, ZEL_SVC_ELEMENT_COUNT> kZelSvcElement
 
 extern constexpr ZelSvcParseBegin kZelSvcParseBegins[] = {
     zel_svc_element_act_network_info_begin_parse,
+    zel_svc_element_act_bookmark_begin_parse,
+    zel_svc_element_act_quick_access_begin_parse,
     zel_svc_element_act_syncml_begin_parse,
     zel_svc_element_act_connection_handle_begin_parse,
     zel_svc_element_act_connection_profile_begin_parse,

@@ -1,21 +1,17 @@
 #include "spec/zel-svc-encode-writer.h"
 
+#include "base/zel-svc-free.h"
 #include "base/zel-svc-guard.h"
 #include "spec/zel-svc-element-stack.h"
 #include "spec/zel-svc-element-table.h"
 #include "spec/zel-svc-xml.h"
 
 #include <algorithm>
-#include <memory>
 
 namespace {
 
 constexpr std::string_view kHeader = "\xEF\xBB\xBF<?xml version=\"1.0\" encoding=\"UTF-8\" ?>\n";
 constexpr std::size_t kIndentation = 2;
-
-struct FreeText {
-    void operator()(char *text) const { std::free(text); }
-};
 
 const ZelSvcElement &row_of(ZelSvcElementId id) { return kZelSvcElementTable.at(static_cast<std::size_t>(id)); }
 
@@ -62,7 +58,7 @@ void ZelSvcEncodeWriter::start_element(ZelSvcElementId id) {
 void ZelSvcEncodeWriter::value(ZelSvcElementId id) {
     ZelSvcExportText text;
     call(row_of(id).value, OccurrenceKind::Value, id, &text);
-    const std::unique_ptr<char, FreeText> escaped{zel_svc_str_replace_all(text.c_str(), "&", "&amp;")};
+    const ZelSvcOwnedText escaped{zel_svc_str_replace_all(text.c_str(), "&", "&amp;")};
     text_.put(escaped ? std::string_view{escaped.get()} : text.view());
 }
 

@@ -1,6 +1,7 @@
 #include "spec/zel-svc-spec-file.h"
 
 #include "base/zel-svc-file.h"
+#include "base/zel-svc-free.h"
 #include "base/zel-svc-observer.h"
 #include "spec/zel-svc-element-dispatcher.h"
 #include "spec/zel-svc-element-stack.h"
@@ -21,12 +22,8 @@ namespace {
 // The byte-order mark that every spec file begins with.
 constexpr std::int32_t kMarkSize = 3;
 
-struct FreeMemory {
-    void operator()(char *bytes) const { std::free(bytes); }
-};
-
 struct SpecBytes {
-    std::unique_ptr<char, FreeMemory> bytes;
+    ZelSvcOwnedText bytes;
     std::int32_t length = 0;
     const char *missing = nullptr; // why there are none
 };
