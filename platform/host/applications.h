@@ -9,6 +9,9 @@
 
 namespace zel_host {
 
+// The most of a name or an answer that fits on a line of the tools' results.
+inline constexpr std::size_t kLongestInResult = 900;
+
 struct Application {
     std::string name;
     std::string type;

@@ -49,6 +49,19 @@ std::string install(Phone &phone, const char *name, const char *type) {
     return std::string(kSuccess);
 }
 
+// A file of results holds lines of 1,022 bytes and texts between quotes: other names are refused, and not told.
+bool is_name(std::string_view name) {
+    return !name.empty() && name.size() <= kLongestInResult && name.find('"') == std::string_view::npos;
+}
+
+// What is said about one application of a list.
+std::string result_of(Phone &phone, const char *name, const char *type, int number) {
+    const bool named = is_name(name);
+    const std::string answer = named ? install(phone, name, type) : "wrong name";
+    return numbered("description", number) + " = \"path=" + (named ? name : "") + ":op=install\"\n" +
+           numbered("result", number) + " = \"" + answer + "\"\n";
+}
+
 // pkgcmd -S LIST -p RESULTS: every application of the list, and what became of it.
 int install_list(Phone &phone, const Words &words) {
     const List list = load_list(phone, word_after(words, "-S"));
@@ -56,9 +69,8 @@ int install_list(Phone &phone, const Words &words) {
     std::string results;
     int count = 0;
     while (const char *name = listed(list, "name", count + 1)) {
-        const std::string answer = install(phone, name, listed(list, "type", ++count));
-        results += numbered("description", count) + " = \"path=" + name + ":op=install\"\n";
-        results += numbered("result", count) + " = \"" + answer + "\"\n";
+        ++count;
+        results += result_of(phone, name, listed(list, "type", count), count);
     }
     const Fd file(open_file(phone, word_after(words, "-p"), O_WRONLY | O_CREAT | O_TRUNC, 0644));
     const std::string head = "[result]\ncount = " + std::to_string(count) + "\n";

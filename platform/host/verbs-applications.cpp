@@ -27,6 +27,7 @@ Json refuse(Phone &phone, const Json &arguments) {
     found.refusal = text_of(arguments, "answer");
     if (found.refusal.find_first_of("\"\n") != std::string::npos)
         throw WrongArguments("an answer is one line without quotes");
+    if (found.refusal.size() > kLongestInResult) throw WrongArguments("an answer has at most 900 bytes");
     keep_application(phone, found);
     return shown(found);
 }

@@ -21,6 +21,12 @@ struct Applications : zel_test::BenchPhone {
             if (one.at("name") == name) return one;
         return nullptr;
     }
+    int result_of(const std::string &verb, const json &arguments) {
+        zel_host_phone *phone = zel_host_open(root().c_str(), nullptr);
+        const int result = zel_host_call(phone, verb.c_str(), arguments.dump().c_str(), nullptr);
+        zel_host_close(phone);
+        return result;
+    }
 };
 
 TEST_F(Applications, OfAListAreInstalledAndTold) {
@@ -50,6 +56,30 @@ TEST_F(Applications, ThatAreRefusedAreToldSo) {
     call("app-refuse", {{"name", "com.example.notes"}});
     EXPECT_EQ(zel_platform_command("/usr/bin/pkg -d com.example.notes"), 0);
     EXPECT_EQ(application("com.example.notes").at("state"), "disabled");
+}
+
+// Whatever stands in a list, its results load again, a line for each application.
+TEST_F(Applications, WhoseNamesNoResultCanHoldAreRefused) {
+    const std::string longest(900, 'x');
+    write("/opt/list.ini",
+          "[zel packages]\nname_001 =\nname_002 = 'a\"b'\nname_003 = " + longest + "x\nname_004 = " + longest + "\n");
+    EXPECT_EQ(zel_platform_command(kInstall), 0);
+    std::string expected = "[result]\ncount = 4\n";
+    for (const char *number : {"001", "002", "003"})
+        expected +=
+            std::string{"description_"} + number + " = \"path=:op=install\"\nresult_" + number + " = \"wrong name\"\n";
+    EXPECT_EQ(read("/opt/result.ini"),
+              expected + "description_004 = \"path=" + longest + ":op=install\"\nresult_004 = \"success\"\n");
+    EXPECT_EQ(call("app-list").at("applications").size(), 1U);
+    EXPECT_EQ(application(longest).at("state"), "installed");
+}
+
+TEST_F(Applications, AreRefusedWithAnAnswerThatAResultCanHold) {
+    call("app-refuse", {{"name", "a"}, {"answer", std::string(900, 'x')}});
+    for (const std::string &answer : {std::string(901, 'x'), std::string{"\""}, std::string{"a\nb"}}) {
+        EXPECT_EQ(result_of("app-refuse", {{"name", "a"}, {"answer", answer}}), 2) << answer;
+    }
+    EXPECT_EQ(application("a").at("refusal"), std::string(900, 'x'));
 }
 
 TEST_F(Applications, ThatAreUninstalledLoseTheirFiles) {

@@ -1,6 +1,7 @@
 // Applications: the lists that the package tool installs, and what becomes of the operator applications.
 
 #include "service-phone.h"
+#include "support/operator-apps.h"
 
 #include <gmock/gmock.h>
 
@@ -8,6 +9,7 @@ namespace {
 
 using ::testing::ElementsAre;
 using ::testing::IsEmpty;
+using zel_test::kOperatorApps;
 
 constexpr const char *kAppFolder = "/opt/system/zel-default/app";
 
@@ -92,50 +94,23 @@ TEST_F(Apps, OtherCustomersHaveNoOperatorApps) {
     EXPECT_TRUE(exists("/opt/usr/apps/com.skatamfa.apptray/bin/jioapps"));
 }
 
-struct OperatorApp {
-    const char *name;
-    const char *package;
-    const char *executable;
-};
-
-constexpr OperatorApp kApps[] = {
-    {"SkatamfaBeats", "com.skatamfa.beats", "/opt/usr/apps/com.skatamfa.beats/bin/jiobeats"},
-    {"SkatamfaOnDemand", "com.skatamfa.ondemand", "/opt/usr/apps/com.skatamfa.ondemand/bin/jioondemand"},
-    {"SkatamfaXPressNews", "ZFQ9uYrIPH", "/opt/usr/apps/ZFQ9uYrIPH/bin/ZFQ9uYrIPH.SkatamfaNews"},
-    {"MySkatamfa", "AOzuftR6Ou", "/opt/usr/apps/AOzuftR6Ou/bin/AOzuftR6Ou.MySkatamfa"},
-};
-
 // Which of the four are there before the upgrade, bit by bit. The package tool's result file stands for an
 // application that the upgrade brings: the tool writes it where the application's executable lies.
 class OperatorApps : public Apps {
   protected:
     void prepare(unsigned before) {
         for (unsigned i = 0; i < 4; ++i)
-            if ((before >> i & 1U) != 0) write(kApps[i].executable, "old");
+            if (zel_test::holds(before, i)) write(kOperatorApps[i].executable, "old");
     }
-    // What a normal start is expected to log, and the commands that it is expected to give.
+    // What a normal start is expected to log.
     static std::vector<std::string> expected_lines(unsigned before, unsigned after) {
-        std::vector<std::string> lines{"[Config/Start] Check App existence before App upgrade (FOTA)."};
-        for (unsigned i = 0; i < 4; ++i)
-            lines.push_back(std::string{"[Config] "} + kApps[i].name + " App " +
-                            ((before >> i & 1U) != 0 ? "already existed" : "NOT existed") + " before App upgrade.");
-        for (const char *line :
-             {"[Config/End] Check App existence before App upgrade (FOTA).", "[Config/Start] Install default App.",
-              "[Config/Ended] Install default App.", "[Config/Start] Disable App as default."})
+        std::vector<std::string> lines = zel_test::lines_of_check(before);
+        for (const char *line : {"[Config/Start] Install default App.", "[Config/Ended] Install default App."})
             lines.emplace_back(line);
-        for (unsigned i = 0; i < 4; ++i) {
-            const std::string app = std::string{"[Config] "} + kApps[i].name + " App ";
-            if ((before >> i & 1U) != 0) {
-                lines.push_back(app + "is NOT NEW, skip.");
-            } else if ((after >> i & 1U) != 0) {
-                lines.push_back(app + "normally existed.");
-                lines.push_back(app + "is disabled(result=0).");
-            } else {
-                lines.push_back(app + "NOT existed.");
-            }
-        }
-        for (const char *line : {"[Config/Ended] Disable App as default.", "[Config/Start] Remove App manually(FOTA).",
-                                 "[Config] SkatamfaApps App NOT existed.", "[Config/Ended] Remove App manually(FOTA)."})
+        const std::vector<std::string> disable = zel_test::lines_of_disable(before, after);
+        lines.insert(lines.end(), disable.begin(), disable.end());
+        for (const char *line : {"[Config/Start] Remove App manually(FOTA).", "[Config] SkatamfaApps App NOT existed.",
+                                 "[Config/Ended] Remove App manually(FOTA)."})
             lines.emplace_back(line);
         return lines;
     }
@@ -148,20 +123,20 @@ struct OneChanges : OperatorApps, ::testing::WithParamInterface<unsigned> {};
 TEST_P(OneChanges, WithAnyOfTheOthersThere) {
     const unsigned changing = GetParam();
     write_default_list();
-    const unsigned others = 15U & ~(1U << changing);
+    const unsigned others = zel_test::kEveryOperatorApp & ~(1U << changing);
     for (const unsigned before : {0U, others})
         for (const bool comes : {false, true}) {
             call("reset");
             prepare(before);
             if (comes)
                 call("tool-add",
-                     {{"path", "/usr/bin/pkgcmd"}, {"file", kApps[changing].executable}, {"content", "new"}});
-            if (comes) write(std::string{kApps[changing].executable} + ".parent", "");
+                     {{"path", "/usr/bin/pkgcmd"}, {"file", kOperatorApps[changing].executable}, {"content", "new"}});
+            if (comes) write(std::string{kOperatorApps[changing].executable} + ".parent", "");
             zel_svc_config_install_customer("INS", ZEL_SVC_INSTALL_NORMAL_BOOTING);
             const unsigned after = before | (comes ? 1U << changing : 0U);
             EXPECT_TRUE(logged_in_order(expected_lines(before, after))) << before << ' ' << after;
             const nlohmann::json list = call("app-list");
-            const std::string handled = comes ? kApps[changing].package : "com.example.notes";
+            const std::string handled = comes ? kOperatorApps[changing].package : "com.example.notes";
             for (const auto &one : list.at("applications"))
                 EXPECT_EQ(one.at("name"), handled);
             EXPECT_EQ(lines_with("is disabled").size(), comes ? 1U : 0U);
@@ -172,14 +147,15 @@ INSTANTIATE_TEST_SUITE_P(Index, OneChanges, ::testing::Range(0U, 4U));
 
 // A full install knows of no time before: whatever is there is disabled.
 TEST_F(OperatorApps, AFullInstallDisablesWhateverIsThere) {
-    for (unsigned there = 0; there < 16; ++there) {
+    for (unsigned there = 0; there <= zel_test::kEveryOperatorApp; ++there) {
         call("reset");
         prepare(there);
         call("journal-start");
         zel_svc_config_install_customer("INS", ZEL_SVC_INSTALL_CONFIG_MODE);
         std::vector<std::string> expected;
         for (unsigned i = 0; i < 4; ++i)
-            if ((there >> i & 1U) != 0) expected.push_back(std::string{"/usr/bin/pkg -d "} + kApps[i].package);
+            if (zel_test::holds(there, i))
+                expected.push_back(std::string{"/usr/bin/pkg -d "} + kOperatorApps[i].package);
         EXPECT_EQ(commands(), expected) << there;
         EXPECT_TRUE(lines_with("App existence").empty());
         EXPECT_TRUE(lines_with("manually").empty());

@@ -5,6 +5,9 @@
 
 #include <gmock/gmock.h>
 
+#include <filesystem>
+#include <unistd.h>
+
 namespace {
 
 using zel_test::Attributes;
@@ -307,6 +310,61 @@ TEST_F(FsUpdate, TrailingSlashesAreDropped) {
     EXPECT_EQ(read("/opt/target/file"), "phone");
 }
 
+// As a user whom modes stop: the super-user, as whom tests may run, fills any folder.
+class FsUpdateOfAUser : public FsUpdate {
+  protected:
+    void become_user() {
+        if (::geteuid() != 0) return;
+        constexpr uid_t kUser = 65534;
+        for (const auto &entry : std::filesystem::recursive_directory_iterator(root()))
+            ASSERT_EQ(::lchown(entry.path().c_str(), kUser, kUser), 0);
+        ASSERT_EQ(::chown(root().c_str(), kUser, kUser), 0);
+        ASSERT_EQ(::seteuid(kUser), 0);
+        super_user_ = true;
+    }
+    void TearDown() override {
+        if (super_user_) {
+            EXPECT_EQ(::seteuid(0), 0);
+        }
+        FsUpdate::TearDown();
+    }
+
+  private:
+    bool super_user_ = false;
+};
+
+TEST_F(FsUpdateOfAUser, AReadOnlyFolderIsFilledBeforeItIsClosed) {
+    const std::string package = folder_of("DEF") + "/fs";
+    for (const char *path : {"/opt/sealed/file", "/opt/sealed/inner/file"})
+        write_tree("DEF", path, "tree");
+    for (const char *path : {"/opt/sealed/inner", "/opt/sealed"})
+        give(package + path, {.mode = 0555, .uid = 301, .gid = 302, .label = "sealed"});
+    write_script("DEF", "[up_always]\n1_cp_r = /opt/sealed\n");
+    remember(0, 0);
+    become_user();
+    zel_svc_fs_update("XFV", 1);
+    EXPECT_EQ(read("/opt/sealed/file"), "tree");
+    EXPECT_EQ(read("/opt/sealed/inner/file"), "tree");
+    for (const char *path : {"/opt/sealed", "/opt/sealed/inner"})
+        EXPECT_EQ(attributes(path), (Attributes{0555, 301, 302, "sealed"})) << path;
+    for (const char *path : {"/opt/sealed", "/opt/sealed/inner"}) // lets any user remove the phone
+        for (const std::string &place : {package + path, std::string{path}})
+            ::chmod(on_disk(place).c_str(), 0755);
+}
+
+TEST_F(FsUpdate, ACopiedFolderKeepsTheAttributesThatItHas) {
+    const Attributes there{0750, 401, 402, "there"};
+    write_tree("DEF", "/opt/folder/file", "tree");
+    give(folder_of("DEF") + "/fs/opt/folder", {.mode = 0700, .uid = 301, .gid = 302, .label = "tree"});
+    add_folder("/opt/folder");
+    give("/opt/folder", there);
+    write_script("DEF", "[up_always]\n1_cp_r = /opt/folder\n");
+    remember(0, 0);
+    zel_svc_fs_update("XFV", 1);
+    EXPECT_EQ(read("/opt/folder/file"), "tree");
+    EXPECT_EQ(attributes("/opt/folder"), there);
+}
+
 TEST_F(FsUpdate, ACopiedFolderMakesItsLastLevelOnly) {
     write_tree("DEF", "/opt/new/inner/file", "tree");
     write_script("DEF", "[up_always]\n1_cp_r = /opt/new/inner\n");
@@ -356,9 +414,24 @@ TEST_F(FsUpdate, AStateFileThatCannotBeWrittenStopsNothingElse) {
 // The INI library would refuse the whole file at the next start.
 TEST_F(FsUpdate, ACodeThatIsNoKeyLeavesTheStateFileReadable) {
     write_script("DEF", "[rel]\nversion = 2\n");
-    for (const char *code : {"", "a=b", "a:b", "#a", "[a", "a\nb", "a b", "\"a"}) {
+    for (const char *code :
+         {"", "=", "a=b", "a=", "#", "#a", ";a", "a\nb", "\na", "a\n", " ", " a", "a ", "\ta", "a\r"}) {
         zel_svc_fs_update(code, 0);
+        EXPECT_EQ(versions(code), std::string{"DEF 2, "} + code + " -") << code;
         EXPECT_EQ(versions(), "DEF 2, XFV -") << code;
+    }
+}
+
+// Whatever one byte does in front of, inside and behind a code: its version loads back, or none is kept.
+TEST_F(FsUpdate, EveryOtherCodeIsAKeyOfTheStateFile) {
+    write_script("DEF", "[rel]\nversion = 2\n");
+    for (const char *code : {"'a'", "\"a\"", "\"", "'", "a\\", "\\", "a]", "[a]", "[a", "a:b", ":", "a#b", "a;", "a b",
+                             "\xC3\xA9", "\xFF\xFE", "\x80", "\xA0", "\x01"}) {
+        write(folder_of(code) + "/zel-fsupdate.ini", "[rel]\nversion = 7\n[up_1]\nversion = 8\n");
+        zel_svc_fs_update(code, 0);
+        EXPECT_EQ(versions(code), std::string{"DEF 2, "} + code + " 7") << code;
+        zel_svc_fs_update(code, 1);
+        EXPECT_EQ(versions(code), std::string{"DEF 2, "} + code + " 8") << code;
     }
 }
 

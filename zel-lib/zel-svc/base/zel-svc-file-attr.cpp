@@ -6,6 +6,7 @@
 #include <smack.h>
 #include <zel-platform.h>
 
+#include <fcntl.h>
 #include <sys/stat.h>
 
 namespace {
@@ -33,6 +34,12 @@ void __zel_svc_config_set_file_attr(const char *path, int mode, int uid, int gid
 
 void zel_svc_file_set_output_attr(const char *path, const char *label) {
     __zel_svc_config_set_file_attr(path, 0644, ZEL_SVC_FILE_OWNER, ZEL_SVC_FILE_GROUP, label);
+}
+
+ZelSvcFd zel_svc_file_open_output(const char *path, const char *label) {
+    ZelSvcFd file = zel_svc_file_open(path, O_RDWR | O_CREAT | O_TRUNC, 0644);
+    if (file) zel_svc_file_set_output_attr(path, label);
+    return file;
 }
 
 void zel_svc_file_copy_attr(int source_fd, const char *source, int target_fd, const char *target) {

@@ -47,6 +47,9 @@ void __zel_svc_config_set_file_attr(const char *path, int mode, int uid, int gid
 // The attributes that logs, reports, state files and status files share: 0644, 200, 5000 and the label.
 void zel_svc_file_set_output_attr(const char *path, const char *label);
 
+// Empties such a file, or makes it, and opens it for reading and writing.
+ZelSvcFd zel_svc_file_open_output(const char *path, const char *label);
+
 // 1 when the path opens for reading, a folder included, else 0.
 int __zel_svc_config_file_exists(const char *path);
 
@@ -63,6 +66,8 @@ int __zel_svc_config_copy_files(const char *source, const char *target);
 
 // Creates `target` with the source folder's attributes; 1 when done.
 int __zel_svc_config_create_dir_like(const char *source, const char *target);
+// The same with the content behind it; a folder that was there keeps its attributes.
+int zel_svc_file_copy_dir_like(const char *source, const char *target);
 
 // Removes everything inside a folder, links unfollowed, and with remove_too the folder itself.
 int __zel_svc_config_clear_dir(const char *path, int remove_too);

@@ -15,6 +15,7 @@ namespace {
 
 using Step = ZelSvcFolderWalk::Step;
 enum class Subfolders { Copied, Skipped };
+enum class Content { Copied, Left };
 using Identity = std::pair<dev_t, ino_t>;
 
 Identity identity(const struct stat &status) { return {status.st_dev, status.st_ino}; }
@@ -98,6 +99,16 @@ int copy_content(const char *source, const char *target, Subfolders subfolders) 
     return FolderCopy{source, target}.run(subfolders);
 }
 
+// As for the folders below, a new folder's attributes come behind its content.
+int make_like(const char *source, const char *target, Content content) {
+    if (!source || !target || !open_folder(source)) return 0;
+    const bool made = make_folder(target);
+    if (!made && !open_folder(target)) return 0;
+    if (content == Content::Copied) copy_content(source, target, Subfolders::Copied);
+    if (made) copy_folder_attr(source, target);
+    return 1;
+}
+
 // Removes an entry that is no folder, or an empty folder.
 bool remove_entry(int folder, const char *name, bool is_folder) {
     return ::unlinkat(folder, name, is_folder ? AT_REMOVEDIR : 0) == 0;
@@ -137,10 +148,11 @@ int __zel_svc_config_copy_files(const char *source, const char *target) {
 }
 
 int __zel_svc_config_create_dir_like(const char *source, const char *target) {
-    if (!source || !target || !open_folder(source)) return 0;
-    if (!make_folder(target)) return open_folder(target) ? 1 : 0;
-    copy_folder_attr(source, target);
-    return 1;
+    return make_like(source, target, Content::Left);
+}
+
+int zel_svc_file_copy_dir_like(const char *source, const char *target) {
+    return make_like(source, target, Content::Copied);
 }
 
 int __zel_svc_config_clear_dir(const char *path, int remove_too) {

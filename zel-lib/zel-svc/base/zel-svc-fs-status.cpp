@@ -5,7 +5,6 @@
 #include "base/zel-svc-ini.h"
 
 #include <cstdint>
-#include <fcntl.h>
 #include <string>
 
 namespace {
@@ -61,7 +60,7 @@ void __zel_svc_config_fs_status_write(int mode) {
         zel_svc_file_remove(ZEL_SVC_FS_STATUS_VERIFY_PATH);
     }
     const char *path = after_install ? ZEL_SVC_FS_STATUS_CONFIG_PATH : ZEL_SVC_FS_STATUS_VERIFY_PATH;
-    const ZelSvcFd file = zel_svc_file_open(path, O_RDWR | O_CREAT | O_TRUNC, 0644);
+    const ZelSvcFd file = zel_svc_file_open_output(path, "*");
     ZelSvcIni ini = ZelSvcIni::load(file.get());
     if (!ini) return;
     for (std::size_t i = 0; i < ZEL_SVC_FS_STATUS_CATEGORIES.size(); ++i) {
@@ -72,5 +71,4 @@ void __zel_svc_config_fs_status_write(int mode) {
         ini.set(key + "_count", std::to_string(total.count));
     }
     ini.dump(file.get());
-    zel_svc_file_set_output_attr(path, "*");
 }

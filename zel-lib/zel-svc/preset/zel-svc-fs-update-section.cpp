@@ -16,17 +16,12 @@ struct Operation {
     void (*run)(const Paths &paths);
 };
 
-void copy_folder(const Paths &paths) {
-    if (__zel_svc_config_create_dir_like(paths.tree.c_str(), paths.phone.c_str()) == 1)
-        __zel_svc_config_copy_dir(paths.tree.c_str(), paths.phone.c_str());
-}
-
 // A number has one operation: the first of these that is there.
 constexpr Operation kOperations[] = {
     {"rm", [](const Paths &paths) { zel_svc_file_remove(paths.phone.c_str()); }},
     {"rm_r", [](const Paths &paths) { __zel_svc_config_clear_dir(paths.phone.c_str(), 1); }},
     {"cp", [](const Paths &paths) { __zel_svc_config_copy_file(paths.tree.c_str(), paths.phone.c_str()); }},
-    {"cp_r", copy_folder},
+    {"cp_r", [](const Paths &paths) { zel_svc_file_copy_dir_like(paths.tree.c_str(), paths.phone.c_str()); }},
 };
 
 // Scripts name what they touch from the phone's root on and never climb.

@@ -5,9 +5,6 @@
 #include "zel-svc-configuration-customer-path.h"
 #include "zel-svc.h"
 
-#include <algorithm>
-#include <fcntl.h>
-
 namespace {
 
 constexpr std::string_view kDefaults = ZEL_SVC_PRECONFIG_EVERY_CUSTOMER;
@@ -28,19 +25,17 @@ void copy_tree(std::string_view package) {
     __zel_svc_config_copy_dir(zel_svc_customer_preconfig_path(package, "fsupdate/fs").c_str(), "/");
 }
 
-// Empties the state file, or makes it.
-ZelSvcFd open_state_afresh() {
-    ZelSvcFd file = zel_svc_file_open(ZEL_SVC_FS_UPDATE_STATE_PATH, O_RDWR | O_CREAT | O_TRUNC, 0644);
-    if (file) zel_svc_file_set_output_attr(ZEL_SVC_FS_UPDATE_STATE_PATH, "zel-manager");
-    return file;
-}
+ZelSvcFd open_state_afresh() { return zel_svc_file_open_output(ZEL_SVC_FS_UPDATE_STATE_PATH, "zel-manager"); }
 
-// A customer whose code would break the file's syntax keeps no version: the file must load again.
+// The INI library keeps most codes as a key. Some would be read back as another one, as a comment or as an
+// error that costs the whole file: a customer of such a code keeps no version.
 bool can_be_key(std::string_view code) {
-    static constexpr std::string_view kSyntax = "=:;#[]\"'\\";
-    return !code.empty() && std::all_of(code.begin(), code.end(), [](char c) {
-        return static_cast<unsigned char>(c) > ' ' && kSyntax.find(c) == std::string_view::npos;
-    });
+    constexpr std::string_view kBlanks = " \t\n\v\f\r";
+    constexpr std::string_view kComments = "#;";
+    if (code.empty() || code.find_first_of("=\n") != std::string_view::npos) return false;
+    return !(kComments.find(code.front()) != std::string_view::npos ||
+             kBlanks.find(code.front()) != std::string_view::npos ||
+             kBlanks.find(code.back()) != std::string_view::npos);
 }
 
 void set_version(ZelSvcIni &state, std::string_view package, int version) {

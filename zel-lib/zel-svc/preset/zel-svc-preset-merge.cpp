@@ -8,7 +8,6 @@
 #include "zel-svc.h"
 
 #include <algorithm>
-#include <fcntl.h>
 #include <string>
 
 namespace {
@@ -75,13 +74,11 @@ class Merge {
 
 bool zel_svc_preset_merge(std::string_view customer, int kind, ZelSvcPresetFlags &chosen) {
     zel_svc_file_remove(ZEL_SVC_PRESET_MERGED_PATH);
-    const ZelSvcFd file = zel_svc_file_open(ZEL_SVC_PRESET_MERGED_PATH, O_RDWR | O_CREAT | O_TRUNC, 0644);
+    const ZelSvcFd file = zel_svc_file_open_output(ZEL_SVC_PRESET_MERGED_PATH, "zel-manager");
     ZelSvcIni merged = ZelSvcIni::load(file.get());
     if (!merged || !merged.add_section(kValues)) return false;
     Merge merge{merged, chosen, kind != ZEL_SVC_INSTALL_CONFIG_MODE};
     merge.add(ZEL_SVC_PRECONFIG_EVERY_CUSTOMER);
     merge.add(customer);
-    const bool written = merged.dump(file.get());
-    zel_svc_file_set_output_attr(ZEL_SVC_PRESET_MERGED_PATH, "zel-manager");
-    return written;
+    return merged.dump(file.get());
 }

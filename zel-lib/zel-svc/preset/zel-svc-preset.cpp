@@ -11,12 +11,8 @@
 
 namespace {
 
-void store(const ZelSvcPresetRow &row, const ZelSvcIni &merged, const std::string &key) {
+void store_number(const ZelSvcPresetRow &row, const ZelSvcIni &merged, const std::string &key) {
     constexpr int kNoValue = -1;
-    if (row.type == ZelSvcPresetType::String) {
-        vconf_set_str(row.store, merged.text(key));
-        return;
-    }
     const bool boolean = row.type == ZelSvcPresetType::Boolean;
     const int value = boolean ? merged.boolean(key, kNoValue) : merged.number(key, kNoValue);
     if (value == kNoValue) return;
@@ -32,8 +28,10 @@ void apply_row(const ZelSvcPresetRow &row, const ZelSvcIni &merged) {
     if (!value) return;
     if (row.act)
         row.act(value);
+    else if (row.type == ZelSvcPresetType::String)
+        vconf_set_str(row.store, value);
     else
-        store(row, merged, key);
+        store_number(row, merged, key);
 }
 
 void apply(const ZelSvcPresetFlags &chosen) {
