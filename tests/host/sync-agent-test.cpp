@@ -170,16 +170,35 @@ TEST_F(SyncAgent, RefusesNullPointers) {
     const sync_agent_ds_server_info server{};
     EXPECT_NE(sync_agent_ds_get_all_profile(nullptr), 0);
     EXPECT_NE(sync_agent_ds_create_profile_info(nullptr), 0);
-    EXPECT_NE(sync_agent_ds_get_profile_name(nullptr, nullptr), 0);
+    EXPECT_NE(sync_agent_ds_get_profile_name(profile, nullptr), 0);
     EXPECT_NE(sync_agent_ds_get_server_info(profile, nullptr), 0);
     EXPECT_NE(sync_agent_ds_get_sync_service_info(profile, nullptr), 0);
     EXPECT_NE(sync_agent_ds_set_profile_name(profile, nullptr), 0);
-    EXPECT_NE(sync_agent_ds_set_server_info(profile, &server), 0);
+    EXPECT_NE(sync_agent_ds_set_server_info(profile, nullptr), 0);
+    EXPECT_NE(sync_agent_ds_set_server_info(profile, &server), 0) << "its texts are null";
     EXPECT_NE(sync_agent_ds_set_sync_service_info(profile, nullptr), 0);
     EXPECT_NE(sync_agent_ds_add_profile(nullptr), 0);
     EXPECT_NE(sync_agent_ds_delete_profile(nullptr), 0);
     EXPECT_EQ(sync_agent_ds_free_profile_info(nullptr), 0);
     EXPECT_EQ(sync_agent_ds_free_profile_info(profile), 0);
+}
+
+TEST_F(SyncAgent, RefusesAProfileThatIsNull) {
+    ASSERT_EQ(sync_agent_ds_init(), 0);
+    const char *name = nullptr;
+    GList *list = nullptr;
+    sync_agent_ds_server_info server{.address = "", .user_id = "", .password = ""};
+    const sync_agent_ds_service_info service{};
+    EXPECT_NE(sync_agent_ds_get_profile_name(nullptr, &name), 0);
+    EXPECT_NE(sync_agent_ds_get_server_info(nullptr, &server), 0);
+    EXPECT_NE(sync_agent_ds_get_sync_service_info(nullptr, &list), 0);
+    EXPECT_NE(sync_agent_ds_set_profile_name(nullptr, "x"), 0);
+    EXPECT_NE(sync_agent_ds_set_profile_attribute(nullptr, 1), 0);
+    EXPECT_NE(sync_agent_ds_set_server_info(nullptr, &server), 0);
+    EXPECT_NE(sync_agent_ds_set_sync_info(nullptr, 0, 0, 1), 0);
+    EXPECT_NE(sync_agent_ds_set_sync_service_info(nullptr, &service), 0);
+    EXPECT_EQ(name, nullptr);
+    EXPECT_EQ(list, nullptr);
 }
 
 TEST_F(SyncAgent, JournalHoldsNoPassword) {

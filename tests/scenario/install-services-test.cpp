@@ -179,7 +179,6 @@ TEST_F(InstallServices, OperatorsBookmarksComeWithTheSim) {
 TEST_F(InstallServices, FailuresOfOneItemLeaveTheOthersAndTheRun) {
     call("fault-add", {{"function", "bookmark_zel_create"}, {"text", "News"}});
     call("fault-add", {{"function", "sync_agent_ds_add_profile"}});
-    call("journal-start");
     zel_svc_config_set_pre_config_for_config_mode("XFV");
     EXPECT_THAT(titles(), ElementsAre("Operator portal", "News & weather", "Weather"));
     EXPECT_TRUE(logged_in_order({"[Bookmark/Start] Set bookmark.", "[Bookmark/Start] Set bookmark.",

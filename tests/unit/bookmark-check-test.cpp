@@ -88,6 +88,36 @@ TEST_F(CheckedBookmark, IndexGoesOnUntilTheNextCount) {
               "[Bookmark1/BookmarkName] Spec='Morning',Phone='Portal'");
 }
 
+TEST_F(CheckedBookmark, CountInAnInstallLeavesTheIndex) {
+    const LoadedGroup group{ZEL_SVC_DATA_BOOKMARK};
+    const std::string one = bookmark(leaf("BookmarkName", "Portal"));
+    verify_spec(one);
+    install_spec("<NbBookmark>1</NbBookmark>" + one);
+    ASSERT_EQ(bookmarks().size(), 1U);
+    EXPECT_THAT(verify_spec(one), ElementsAre(failed("[Bookmark2] Reading phone failed")));
+}
+
+TEST_F(CheckedBookmark, CountThatIsNotCheckedTakesTheIndexBackAllTheSame) {
+    const std::string count = leaf("NbBookmark", "2");
+    const std::string one = bookmark(leaf("BookmarkName", "Portal"));
+    verify_spec(one);
+    EXPECT_THAT(verify_spec(count, ZEL_SVC_PARSE_MODE_FULL), IsEmpty());
+    EXPECT_EQ(verify_spec(one).at(0), passed("[Bookmark1/Folder] Spec='',Phone=''"));
+    set_auto_flag(ZEL_SVC_AUTO_BOOKMARK, 1);
+    EXPECT_THAT(verify_spec(count), IsEmpty());
+    set_auto_flag(ZEL_SVC_AUTO_BOOKMARK, 0);
+    EXPECT_EQ(verify_spec(one).at(0), passed("[Bookmark1/Folder] Spec='',Phone=''"));
+}
+
+TEST_F(CheckedBookmark, ThatIsNotCheckedLeavesTheIndex) {
+    const std::string one = bookmark(leaf("BookmarkName", "Portal"));
+    EXPECT_THAT(verify_spec(one, ZEL_SVC_PARSE_MODE_FULL), IsEmpty());
+    set_auto_flag(ZEL_SVC_AUTO_BOOKMARK, 1);
+    EXPECT_THAT(verify_spec(one), IsEmpty());
+    set_auto_flag(ZEL_SVC_AUTO_BOOKMARK, 0);
+    EXPECT_EQ(verify_spec(one).at(0), passed("[Bookmark1/Folder] Spec='',Phone=''"));
+}
+
 TEST_F(CheckedBookmark, IndexStartsAtZeroInAFreshProcess) {
     EXPECT_EQ(verify_spec(bookmark(leaf("BookmarkName", "Portal"))).at(1),
               passed("[Bookmark1/BookmarkName] Spec='Portal',Phone='Portal'"));
@@ -106,6 +136,18 @@ TEST_F(CheckedBookmark, LongTextsAreComparedCut) {
     call("bookmarks-clear");
     call("bookmarks-add", {{"title", text.substr(0, 199)}, {"url", "http://p"}});
     EXPECT_EQ(verify_spec(bookmark(leaf("BookmarkName", text))).at(1).passed, true);
+}
+
+TEST_F(CheckedBookmark, LongEditableIsShownCut) {
+    EXPECT_EQ(verify_spec(bookmark(leaf("Editable", "a word of thirty characters..."))).at(0),
+              failed("[Bookmark1/Editable] Spec='a word of thirty ch',Phone='no'"));
+}
+
+TEST_F(CheckedBookmark, LongTextsOfThePhoneAreExportedCut) {
+    const std::string text(250, 'x');
+    call("bookmarks-clear");
+    call("bookmarks-add", {{"title", text}, {"url", text}, {"folder", text}});
+    EXPECT_THAT(exported_bookmark(), ElementsAre("yes", text.substr(0, 199), text.substr(0, 199), text.substr(0, 199)));
 }
 
 TEST_F(CheckedBookmark, FailsWhereTheServiceCannotBeAsked) {

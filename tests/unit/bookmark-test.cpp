@@ -2,6 +2,7 @@
 
 #include "services-phone.h"
 
+#include <bookmark.h>
 #include <gmock/gmock.h>
 
 namespace zel_test {
@@ -18,6 +19,16 @@ std::string bookmark(const std::string &network, const std::string &editable, co
 }
 
 std::optional<std::string> recorded(const LoadedGroup &group, const char *key) { return group.text("bookmark", key); }
+
+constexpr int kRoot = 1;
+
+int make_folder(std::string title, int parent) {
+    const bookmark_zel_info info{
+        .is_folder = 1, .parent = parent, .editable = 1, .title = title.data(), .url = nullptr};
+    int id = 0;
+    EXPECT_EQ(bookmark_zel_create(&info, &id), 0);
+    return id;
+}
 
 constexpr const char *kSetLines = "[Bookmark/Start] Set bookmark.\n[Bookmark/Ended] Set bookmark.\n";
 
@@ -70,9 +81,17 @@ TEST_F(Bookmark, TwoOfTheSameFolderShareIt) {
 TEST_F(Bookmark, GoesIntoTheFirstFolderOfItsTitleInTheRoot) {
     const LoadedGroup group{ZEL_SVC_DATA_BOOKMARK};
     call("bookmarks-add", {{"title", "News"}, {"url", "http://no.folder"}});
-    call("bookmarks-add", {{"title", "old"}, {"url", "http://o"}, {"folder", "News"}});
+    ASSERT_EQ(bookmark_zel_initialize(), 0);
+    make_folder("News", make_folder("Other", kRoot));
+    const int first = make_folder("News", kRoot);
+    make_folder("News", kRoot);
+    ASSERT_EQ(bookmark_zel_deinitialize(), 0);
     install_spec(bookmark("", "", "News", "new", "http://n"));
-    EXPECT_THAT(shown_bookmarks(), ElementsAre("News", "News/", "News/old", "News/new"));
+    const nlohmann::json all = bookmarks();
+    ASSERT_EQ(all.size(), 6U);
+    EXPECT_EQ(all[5].at("title"), "new");
+    EXPECT_EQ(all[5].at("parent"), first);
+    EXPECT_EQ(group.number("bookmark", "folder_id_1"), first);
 }
 
 TEST_F(Bookmark, OnlyTheTextNoKeepsItFromBeingEdited) {

@@ -4,9 +4,11 @@
 #include "data-sync-spec.h"
 
 #include <gmock/gmock.h>
+#include <sync-agent.h>
 
 namespace zel_test {
 
+using testing::Contains;
 using testing::ElementsAre;
 using testing::IsEmpty;
 
@@ -35,6 +37,12 @@ const std::vector<std::string> kFirst = {"Work",   "http://Work", "Work-user", "
                                          "con-id", "con-secret",  "off",       "cal-name",    "cal-id", "cal-secret"};
 const std::vector<std::string> kSecond = {"Home", "", "", "", "off", "book", "", "", "", "", "", ""};
 const std::vector<std::string> kNothing(12);
+
+// The item that the next verification reads.
+std::string next_item() {
+    const std::vector<ResultLine> lines = verify_spec(syncml(leaf("DataSync", "")));
+    return lines.empty() ? "" : lines.front().text.substr(0, std::string_view{"[SyncML_DS1"}.size());
+}
 
 } // namespace
 
@@ -104,6 +112,64 @@ TEST_F(CheckedDataSync, PositionGoesBackWithTheCount) {
     EXPECT_THAT(verify_spec(syncml(one)), ElementsAre(failed("[SyncML_DS4] Reading phone failed")));
     EXPECT_EQ(verify_spec(syncml(leaf("NbDataSync", "2") + one)).at(1),
               passed("[SyncML_DS1/AccName] Spec='Work',Phone='Work'"));
+}
+
+TEST_F(CheckedDataSync, CountTakesThePositionBackInEveryCase) {
+    const std::string count = syncml(leaf("NbDataSync", "2"));
+    EXPECT_EQ(next_item(), "[SyncML_DS1");
+    EXPECT_EQ(next_item(), "[SyncML_DS2");
+    EXPECT_THAT(verify_spec(count, ZEL_SVC_PARSE_MODE_FULL), IsEmpty());
+    EXPECT_EQ(next_item(), "[SyncML_DS1") << "in another mode";
+    set_auto_flag(ZEL_SVC_AUTO_SYNCML, 1);
+    EXPECT_THAT(verify_spec(count), IsEmpty());
+    set_auto_flag(ZEL_SVC_AUTO_SYNCML, 0);
+    EXPECT_EQ(next_item(), "[SyncML_DS1") << "where the SIM has the say";
+    fail("sync_agent_ds_init", "", 1, 1);
+    install_spec(count);
+    EXPECT_EQ(next_item(), "[SyncML_DS1") << "in an install without agent";
+    install_spec(count);
+    EXPECT_EQ(next_item(), "[SyncML_DS1") << "in an install";
+}
+
+TEST_F(CheckedDataSync, ThatIsNotCheckedLeavesThePosition) {
+    const std::string one = syncml(account("", "Work"));
+    EXPECT_THAT(verify_spec(one, ZEL_SVC_PARSE_MODE_FULL), IsEmpty());
+    set_auto_flag(ZEL_SVC_AUTO_SYNCML, 1);
+    EXPECT_THAT(verify_spec(one), IsEmpty());
+    set_auto_flag(ZEL_SVC_AUTO_SYNCML, 0);
+    EXPECT_EQ(next_item(), "[SyncML_DS1");
+}
+
+TEST_F(CheckedDataSync, OutsideOfSyncMlNothingCanBeRead) {
+    EXPECT_THAT(verify_spec(leaf("NbDataSync", "2") + account("", "Work")),
+                ElementsAre(failed("[SyncML_DS/NbDataSync] Spec='2',Phone='?\?'"),
+                            failed("[SyncML_DS1] Reading phone failed")));
+    EXPECT_EQ(calls_of("sync_agent_ds_init"), 0);
+}
+
+TEST_F(CheckedDataSync, LongEnableTextIsShownCut) {
+    const std::vector<ResultLine> lines =
+        verify_spec(syncml(leaf("DataSync", leaf("ContactDB", leaf("EnableFlag", "on and on and on and on")))));
+    EXPECT_THAT(lines, Contains(failed("[SyncML_DS1/Contact_EnableFlag] Spec='on and on and on an',Phone='on'")));
+}
+
+TEST_F(CheckedDataSync, ServiceOfAnotherTypeIsNeitherContactsNorCalendar) {
+    call("sync-accounts-clear");
+    ASSERT_EQ(sync_agent_ds_init(), 0);
+    sync_agent_ds_profile *profile = nullptr;
+    ASSERT_EQ(sync_agent_ds_create_profile_info(&profile), 0);
+    ASSERT_EQ(sync_agent_ds_set_profile_name(profile, "Notes"), 0);
+    const sync_agent_ds_service_info service{
+        .type = 2, .enabled = 1, .source = 2, .database_name = "notes", .database_id = "id", .database_password = "p"};
+    ASSERT_EQ(sync_agent_ds_set_sync_service_info(profile, &service), 0);
+    ASSERT_EQ(sync_agent_ds_add_profile(profile), 0);
+    ASSERT_EQ(sync_agent_ds_free_profile_info(profile), 0);
+    ASSERT_EQ(sync_agent_ds_deinit(), 0);
+    export_start(ZEL_SVC_ELEMENT_SYNCML);
+    std::vector<std::string> expected(12);
+    expected[0] = "Notes";
+    EXPECT_EQ(exported_account(), expected);
+    export_end(ZEL_SVC_ELEMENT_SYNCML);
 }
 
 TEST_F(CheckedDataSync, IsNotCheckedWhenItComesFromTheSimOrInOtherModes) {

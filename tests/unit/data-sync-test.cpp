@@ -114,11 +114,13 @@ TEST_F(DataSync, EmptyTextsOfAServiceAreAbsentForTheAgentAndRecordedEmpty) {
 TEST_F(DataSync, TextsAreCutToTheirFields) {
     const LoadedGroup group{ZEL_SVC_DATA_SYNCML_DS};
     const std::string text(250, 'x');
-    install_spec(syncml(leaf("DataSync", leaf("AccName", text) + leaf("ServAddr", text) + leaf("UserId", text) +
-                                             leaf("Password", text) + leaf("ContactDB", leaf("DBName", text)))));
+    install_spec(syncml(leaf(
+        "DataSync", leaf("AccName", text) + leaf("ServAddr", text) + leaf("UserId", text) + leaf("Password", text) +
+                        leaf("DBList", database("ContactDB", "on", text) + database("CalendarDB", "on", text)))));
     const nlohmann::json made = accounts();
     ASSERT_EQ(made.size(), 1U);
-    for (const char *name : {"name", "address", "user_id", "password", "contacts_name"})
+    for (const char *name : {"name", "address", "user_id", "password", "contacts_name", "contacts_id",
+                             "contacts_password", "calendar_name", "calendar_id", "calendar_password"})
         EXPECT_EQ(made[0].at(name), text.substr(0, 199)) << name;
 }
 
@@ -129,6 +131,29 @@ TEST_F(DataSync, NumbersGoOnFromAccountToAccount) {
     EXPECT_EQ(recorded(group, "count"), "3");
     EXPECT_EQ(recorded(group, "account_name_3"), "c");
     EXPECT_THAT(account_names(), ElementsAre("a", "b", "c"));
+}
+
+TEST_F(DataSync, InstallMovesThePositionOnWhetherTheAccountWasTakenOrNot) {
+    const LoadedGroup group{ZEL_SVC_DATA_SYNCML_DS};
+    const std::string one = syncml(account("", "Work"));
+    install_spec(one);
+    EXPECT_THAT(verify_spec(one), ElementsAre(failed("[SyncML_DS2] Reading phone failed")));
+    fail("sync_agent_ds_add_profile", "", 1, 1);
+    install_spec(one);
+    EXPECT_EQ(account_names().size(), 1U);
+    EXPECT_THAT(verify_spec(one), ElementsAre(failed("[SyncML_DS4] Reading phone failed")));
+}
+
+TEST_F(DataSync, InstallThatTriesNoneLeavesThePosition) {
+    const LoadedGroup group{ZEL_SVC_DATA_SYNCML_DS};
+    const std::string one = syncml(account("One", "Work"));
+    fail("sync_agent_ds_init", "", 1, 1);
+    install_spec(one);
+    set_auto_flag(ZEL_SVC_AUTO_SYNCML, 1);
+    install_spec(one);
+    set_auto_flag(ZEL_SVC_AUTO_SYNCML, 0);
+    install_spec(one, ZEL_SVC_PARSE_MODE_OPERATOR);
+    EXPECT_THAT(verify_spec(one), ElementsAre(failed("[SyncML_DS1] Reading phone failed")));
 }
 
 TEST_F(DataSync, FullInstallLeavesTheSimsAccountsOut) {

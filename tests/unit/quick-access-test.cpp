@@ -132,6 +132,29 @@ TEST_F(QuickAccess, NumberStartsAtOneAndGoesBackToOneWithTheCount) {
                 ElementsAre(passed("[QuickAccess/QATitle] Spec='first',Phone='first'")));
 }
 
+TEST_F(QuickAccess, CountInAnInstallLeavesTheNumber) {
+    const LoadedGroup group{ZEL_SVC_DATA_QUICK_ACCESS};
+    install_spec(entry("yes", "first", "1") + entry("no", "second", "2"));
+    EXPECT_THAT(exported_entry(), ElementsAre("yes", "first", "1"));
+    install_spec(leaf("NbQuickAccess", "2"));
+    EXPECT_THAT(exported_entry(), ElementsAre("no", "second", "2"));
+}
+
+TEST_F(QuickAccess, EveryModeVerifiesWhateverTheFlags) {
+    const LoadedGroup group{ZEL_SVC_DATA_QUICK_ACCESS};
+    install_spec(entry("yes", "Portal", "http://p"));
+    for (const int mode : {0, 1, 2, 3, 4, 5, 7}) {
+        set_auto_flag(ZEL_SVC_AUTO_BOOKMARK, mode % 2);
+        EXPECT_THAT(verify_spec(leaf("NbQuickAccess", "1") + entry("yes", "Portal", "http://p"),
+                                static_cast<ZelSvcParseMode>(mode)),
+                    ElementsAre(passed("[QuickAccess/NbQuickAccess] Spec='1',Phone='1'"),
+                                passed("[QuickAccess/Editable] Spec='yes',Phone='yes'"),
+                                passed("[QuickAccess/QATitle] Spec='Portal',Phone='Portal'"),
+                                passed("[QuickAccess/QAURL] Spec='http://p',Phone='http://p'")))
+            << mode;
+    }
+}
+
 TEST_F(QuickAccess, ExportShowsOtherNumbersAsNothing) {
     const LoadedGroup group{ZEL_SVC_DATA_QUICK_ACCESS};
     zel_svc_data_set_int(ZEL_SVC_DATA_QUICK_ACCESS, "quickaccess", "editable_1", 2);
@@ -226,9 +249,49 @@ TEST_F(EManual, IsExportedWhereItIsRecorded) {
 TEST_F(EManual, EmptyUrlChangesNothing) {
     const LoadedGroup group{ZEL_SVC_DATA_BROWSER};
     start_journal();
-    install_spec("<eManual><URL></URL></eManual>");
+    Occurrence empty{.kind = OccurrenceKind::Value,
+                     .element = ZEL_SVC_ELEMENT_E_MANUAL_URL,
+                     .tag = "URL",
+                     .action = ZEL_SVC_PARSE_ACTION_INSTALL,
+                     .mode = ZEL_SVC_PARSE_MODE_FULL};
+    kZelSvcElementTable.at(ZEL_SVC_ELEMENT_E_MANUAL_URL).value(empty);
     EXPECT_EQ(group.text("emanual", "url"), std::nullopt);
     EXPECT_EQ(calls_of("bookmark_zel_set_user_manual_url"), 0);
+}
+
+TEST_F(EManual, EveryModeInstallsAndVerifiesItWhateverTheFlags) {
+    const LoadedGroup group{ZEL_SVC_DATA_BROWSER};
+    for (const int mode : {0, 1, 2, 3, 4, 5, 7}) {
+        set_auto_flag(ZEL_SVC_AUTO_BOOKMARK, mode % 2);
+        const std::string url = "http://mode" + std::to_string(mode);
+        install_spec(spec(url), static_cast<ZelSvcParseMode>(mode));
+        EXPECT_EQ(manual_url(), url);
+        EXPECT_EQ(group.text("emanual", "url"), url);
+        EXPECT_THAT(verify_spec(spec(url), static_cast<ZelSvcParseMode>(mode)),
+                    ElementsAre(passed("[EManual/URL] Spec='" + url + "',Phone='" + url + "'")));
+    }
+}
+
+TEST_F(EManual, IsUnknownWhenTheServiceDoesNotCloseButIsInstalled) {
+    const LoadedGroup group{ZEL_SVC_DATA_BROWSER};
+    fail("bookmark_zel_deinitialize");
+    install_spec(spec("http://a"));
+    EXPECT_EQ(group.text("emanual", "url"), "http://a");
+    EXPECT_THAT(verify_spec(spec("http://a")), ElementsAre(failed("[EManual/URL] Spec='http://a',Phone='?\?'")));
+    EXPECT_EQ(export_value(ZEL_SVC_ELEMENT_E_MANUAL_URL), "??");
+}
+
+TEST_F(EManual, LongUrlReachesTheServiceWholeAndIsCutInTheRecordAndTheExport) {
+    const LoadedGroup group{ZEL_SVC_DATA_BROWSER};
+    const std::string url = "http://" + std::string(273, 'u');
+    install_spec(spec(url));
+    EXPECT_EQ(manual_url(), url);
+    EXPECT_EQ(group.text("emanual", "url"), url.substr(0, 255));
+    const std::vector<ResultLine> lines = verify_spec(spec(url));
+    ASSERT_EQ(lines.size(), 1U);
+    EXPECT_TRUE(lines[0].passed) << lines[0];
+    EXPECT_FALSE(verify_spec(spec(url.substr(0, 279))).at(0).passed) << "the end counts too";
+    EXPECT_EQ(export_value(ZEL_SVC_ELEMENT_E_MANUAL_URL), url.substr(0, 199));
 }
 
 } // namespace zel_test
