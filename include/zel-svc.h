@@ -87,7 +87,8 @@ typedef struct {
 
 /* Identity of an inserted SIM: its IMSI in two parts (3GPP TS 23.003, clause 2.2), and what tells an operator
  * from another one of the same network (EF GID1 and EF SPN, 3GPP TS 31.102). The MSIN identifies a subscriber:
- * no log of this library shows more than its first three digits, and no caller's should. */
+ * the logs of this library show its first three digits, and as many as the subset code that it matched has; a
+ * caller's should show no more. */
 typedef struct {
     char mccmnc[10];
     char msin[20];
@@ -101,7 +102,7 @@ typedef enum {
     ZEL_SVC_SIM_SELECTION_NEEDED = 1,  /* the user has to choose for at least one slot, whatever the other did */
     ZEL_SVC_SIM_NOTHING_INSTALLED = 2, /* no SIM, the same one as last time, an unreadable one, or no operator */
     ZEL_SVC_SIM_NO_CUSTOMER = 3,       /* the phone has no active customer */
-    ZEL_SVC_SIM_DISABLED = 4           /* the customer's file leaves nothing to the SIM */
+    ZEL_SVC_SIM_DISABLED = 4           /* the phone's switch for it is off or unreadable */
 } ZelSvcSimResult;
 
 /* One operator of a customer: the customer whose file is installed and the network it is installed for. */
@@ -296,8 +297,8 @@ ZEL_SVC_API int zel_svc_config_encoding_xml(void);
  */
 ZEL_SVC_API int zel_svc_sim_auto_setting_execute_by_sim(void);
 
-/* Whether the SIM decides the operator: 0 no (the active customer's file leaves nothing to the SIM, or there is
- * no active customer), 1 yes, 2 yes and a choice of the user is awaited for a slot. */
+/* Whether the SIM decides the operator: 0 no (the key "db/private/zel/sim_auto_enable" is 0 or cannot be read, or
+ * there is no active customer), 1 yes, 2 yes and a choice of the user is awaited for a slot. */
 ZEL_SVC_API int zel_svc_sim_auto_setting_chk_feature_enable(void);
 
 /* Reads the SIM of a slot. 0, and an empty record, when its IMSI cannot be read. GID and SPN stay empty. */
@@ -331,7 +332,8 @@ ZEL_SVC_API void zel_svc_sim_auto_setting_get_operator_list_by_sim(const ZelSvcS
  *
  * Bookmarks, e-mail accounts and WB-AMR codecs are one for both slots: the later install wins. At the end
  * "memory/zel/sim_auto_setting_updated" becomes 1; nothing in this library resets it. The operator is not
- * recorded as active: see below. Nothing is reported; failures are in the system log.
+ * recorded as active: see below. Nothing is reported: a failed reset is in the system log, but a customer file
+ * that is missing or broken, and what could not be written, show nowhere.
  */
 ZEL_SVC_API void zel_svc_sim_auto_setting_install_operator(const ZelSvcSimOperator *operator_entry, int slot);
 

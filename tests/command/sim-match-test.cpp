@@ -83,6 +83,16 @@ TEST_F(ZelSimMatch, TakesTheSimInTheSlotWithoutADescription) {
     EXPECT_EQ(run_zel({"sim", "match", "--msin", "98"}).code, 2);
 }
 
+TEST_F(ZelSimMatch, OfACardWithoutNetworkNoEntryIsItsOwn) {
+    write_networks("AAA", network("Home", "21405") + network("Nowhere", ""));
+    call("sim-insert", {{"slot", 1}, {"mcc", ""}, {"mnc", ""}, {"msin", "555"}});
+    EXPECT_THAT(all(match({}), "reason"),
+                ElementsAre("the SIM's MCC+MNC is not 21405", "it names no MCC+MNC, so no SIM is its own"));
+    const std::string page = run({"sim", "match"});
+    EXPECT_THAT(page, HasSubstr("PASSED OVER"));
+    EXPECT_THAT(page, ::testing::Not(HasSubstr("VERDICT")));
+}
+
 // The command explains what the library does: both are asked about the same cards.
 TEST_F(ZelSimMatch, SaysWhatARunDoes) {
     for (const auto &[mnc, msin] : {std::pair{"05", "9870000000"}, {"05", "1000000000"}, {"01", "9870000000"}}) {

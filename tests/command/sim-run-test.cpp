@@ -5,6 +5,7 @@
 
 #include <cstdlib>
 #include <gmock/gmock.h>
+#include <sstream>
 #include <sys/stat.h>
 
 using namespace zel_test;
@@ -35,6 +36,29 @@ TEST_F(ZelSimRun, InstallsAndTellsWhatItWroteAboutEachSlot) {
     EXPECT_THAT(page, Not(HasSubstr("9812")));
     EXPECT_EQ(run({"sim", "active"}), "SIM  OPERATOR\n1    Young (21405, MSIN 98...) of AAA\n2    none\n");
     EXPECT_EQ(get_string(kMsin), "9812345678");
+}
+
+// The card's MSIN begins with the code of its operator, so that code is a part of the MSIN. The log's own lines
+// about operators hold it whole.
+TEST_F(ZelSimRun, ShowsThreeDigitsOfALongCodeThatTheCardHas) {
+    write_networks("AAA", network("Long", "21405", one("SPCode", "987654321")) +
+                              network("Other", "21405", one("SPCode", "5")));
+    insert(1, "05", "9876543210");
+    std::istringstream page{run({"sim", "run"})};
+    for (std::string line; std::getline(page, line);)
+        EXPECT_TRUE(line.find("(Subset)") != line.npos || line.find("9876") == line.npos) << line;
+    EXPECT_EQ(run({"sim", "active"}), "SIM  OPERATOR\n1    Long (21405, MSIN 987***) of AAA\n2    none\n");
+    EXPECT_EQ(json_of({"sim", "active"}).at(0).at("subset_code"), "987***");
+    EXPECT_EQ(json_of({"sim", "match"}).at("entries").at(0).at("reason"), "the MSIN begins with 987***");
+    EXPECT_EQ(json_of({"sim", "match"}).at("entries").at(1).at("subset_code"), "5");
+    for (const char *command : {"active", "info", "match"}) {
+        EXPECT_THAT(run({"sim", command}), Not(HasSubstr("9876"))) << command;
+        EXPECT_THAT(run({"sim", command, "--json"}), Not(HasSubstr("9876"))) << command;
+        EXPECT_THAT(run({"sim", command, "--reveal"}), HasSubstr("987654321")) << command;
+        EXPECT_THAT(run({"sim", command, "--json", "--reveal"}), HasSubstr("987654321")) << command;
+    }
+    EXPECT_EQ(json_of({"sim", "install", "Long"}).at("operator").at("subset_code"), "987***");
+    EXPECT_EQ(get_string("db/private/zel/sim_auto_op_subset_code"), "987654321");
 }
 
 TEST_F(ZelSimRun, JournalPageHidesTheMsinThatWasStored) {

@@ -1,5 +1,7 @@
 #include "secrets.h"
 
+#include <base/zel-svc-text.h>
+
 #include <algorithm>
 #include <array>
 
@@ -11,8 +13,7 @@ constexpr std::array<std::string_view, 3> kSecretWords{"msin", "pwd", "password"
 
 std::string lower_case(std::string_view text) {
     std::string result{text};
-    std::transform(result.begin(), result.end(), result.begin(),
-                   [](char byte) { return byte >= 'A' && byte <= 'Z' ? static_cast<char>(byte - 'A' + 'a') : byte; });
+    std::transform(result.begin(), result.end(), result.begin(), zel_svc_text_lower);
     return result;
 }
 

@@ -4,13 +4,13 @@
 #include "failure.h"
 
 #include <base/zel-svc-text.h>
+#include <zel-svc-sim-auto-setting-log.h>
 
 #include <algorithm>
 
 namespace zel_command {
 namespace {
 
-constexpr std::size_t kShownDigits = 3;
 constexpr std::size_t kMccDigits = 3;
 constexpr std::size_t kImsiDigits = 15;
 
@@ -71,7 +71,11 @@ std::vector<int> chosen_slots(const Invocation &invocation) {
 
 std::string shown_msin(std::string_view msin, bool reveal) {
     if (reveal || msin.empty()) return std::string{msin};
-    return std::string{msin.substr(0, zel_svc_text_cut(msin, kShownDigits))} + "***";
+    return zel_svc_sim_msin_shown(msin) + "***";
+}
+
+std::string shown_first_digits(std::string_view code, bool reveal) {
+    return code == zel_svc_sim_msin_shown(code) ? std::string{code} : shown_msin(code, reveal);
 }
 
 ZelSvcSimInfo described_card(const Invocation &invocation) {

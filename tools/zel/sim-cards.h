@@ -19,6 +19,8 @@ std::vector<int> chosen_slots(const Invocation &invocation);
 
 // As much of a subscriber number as people may see: its first three digits.
 std::string shown_msin(std::string_view msin, bool reveal);
+// The same of a code that an MSIN is known to begin with: "98", "987***".
+std::string shown_first_digits(std::string_view code, bool reveal);
 
 // A card that --mccmnc, --msin, --gid and --spn describe. Throws a Failure when it is none.
 ZelSvcSimInfo described_card(const Invocation &invocation);

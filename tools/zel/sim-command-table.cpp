@@ -49,8 +49,9 @@ std::vector<Command> sim_commands() {
          .run = sim_info},
         {.name = "sim run",
          .help = "Install the operator that each new SIM belongs to, as after a start.",
-         .more = "Prints what the run wrote about each slot. Exits 1 without an active customer, when the customer "
-                 "leaves nothing to the SIM, and when a file of the package cannot be read to its end.",
+         .more =
+             "Prints what the run wrote about each slot. Exits 1 without an active customer, when the phone's switch "
+             "for SIM auto setting is not on, and when a file of the package cannot be read to its end.",
          .access = Access::kWrites,
          .run = sim_run},
         {.name = "sim operators",

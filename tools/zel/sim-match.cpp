@@ -18,6 +18,7 @@ struct Question {
     ZelSvcSimInfo sim{};
     CustomerOperators operators;
     ZelSvcSimMatch match;
+    bool reveal = false;
 
     [[nodiscard]] const ZelSvcSimOperator &entry(std::size_t number) const { return operators.entries[number]; }
     [[nodiscard]] bool is_chosen(std::size_t number) const {
@@ -53,10 +54,18 @@ std::string lacking(const char *what, const char *field, const std::string &want
     return std::string{"asks for "} + what + " " + wanted + ", not the SIM's";
 }
 
-std::string decisive_reason(const ZelSvcSimOperator &entry) {
-    if (entry.subset_code[0] != '\0') return "the MSIN begins with " + field_text(entry.subset_code);
-    if (entry.gid[0] != '\0') return "the GID is " + field_text(entry.gid);
+// What the card has. Its MSIN is known by as many digits as the entry asks for, so they are shown as an MSIN is.
+std::string decisive_reason(const Question &question, const ZelSvcSimOperator &entry) {
+    const ZelSvcSimAsks asks = zel_svc_sim_asks(entry);
+    if (asks == ZelSvcSimAsks::Msin)
+        return "the MSIN begins with " + shown_first_digits(field_text(entry.subset_code), question.reveal);
+    if (asks == ZelSvcSimAsks::Gid) return "the GID is " + field_text(entry.gid);
     return "the SPN is " + field_text(entry.sp_name);
+}
+
+std::string other_network_reason(const ZelSvcSimOperator &entry) {
+    if (entry.mccmnc[0] == '\0') return "it names no MCC+MNC, so no SIM is its own";
+    return "the SIM's MCC+MNC is not " + field_text(entry.mccmnc);
 }
 
 std::string plain_reason(const Question &question, std::size_t number) {
@@ -70,7 +79,7 @@ std::string reason_of(const Question &question, std::size_t number) {
     const ZelSvcSimOperator &entry = question.entry(number);
     switch (question.match.verdicts[number]) {
     case Verdict::OtherNetwork:
-        return "the SIM's MCC+MNC is not " + field_text(entry.mccmnc);
+        return other_network_reason(entry);
     case Verdict::OtherMsin:
         return lacking("an MSIN of", question.sim.msin, field_text(entry.subset_code) + "...");
     case Verdict::OtherGid:
@@ -80,8 +89,8 @@ std::string reason_of(const Question &question, std::size_t number) {
     case Verdict::Plain:
         return plain_reason(question, number);
     case Verdict::Decisive:
-        if (question.is_chosen(number)) return decisive_reason(entry);
-        return decisive_reason(entry) + ", but " + entry_name(question, question.decisive()) + " comes first";
+        if (question.is_chosen(number)) return decisive_reason(question, entry);
+        return decisive_reason(question, entry) + ", but " + entry_name(question, question.decisive()) + " comes first";
     }
     return {};
 }
@@ -109,22 +118,27 @@ const char *result_of(const Question &question) {
     return question.match.chosen.size() == 1 ? "one" : "user_chooses";
 }
 
-Json json_of(const Question &question, bool reveal) {
+// An entry whose code is not the card's says nothing about the card, and is shown as the package has it.
+Json entry_json(const Question &question, std::size_t number) {
+    const bool fits = question.match.verdicts[number] == Verdict::Decisive;
+    Json entry = operator_json_of_card(question.entry(number), number, question.reveal || !fits);
+    entry["verdict"] = word_for(question.match.verdicts[number]);
+    entry["chosen"] = question.is_chosen(number);
+    put_text(entry, "reason", reason_of(question, number));
+    return entry;
+}
+
+Json json_of(const Question &question) {
     Json answer = Json::object();
     put_text(answer, "customer", question.operators.customer);
-    answer["sim"] = card_json(question.sim, reveal);
+    answer["sim"] = card_json(question.sim, question.reveal);
     answer["result"] = result_of(question);
     answer["chosen"] = Json::array();
     for (const std::size_t number : question.match.chosen)
         answer["chosen"].push_back(number + 1);
     Json entries = Json::array();
-    for (std::size_t number = 0; number < question.operators.entries.size(); ++number) {
-        Json entry = operator_json(question.entry(number), number);
-        entry["verdict"] = word_for(question.match.verdicts[number]);
-        entry["chosen"] = question.is_chosen(number);
-        put_text(entry, "reason", reason_of(question, number));
-        entries.push_back(std::move(entry));
-    }
+    for (std::size_t number = 0; number < question.operators.entries.size(); ++number)
+        entries.push_back(entry_json(question, number));
     answer["entries"] = std::move(entries);
     return answer;
 }
@@ -144,7 +158,7 @@ void print_entries(const Question &question, bool of_sims_network) {
     std::vector<std::vector<std::string>> rows;
     for (std::size_t number = 0; number < question.operators.entries.size(); ++number) {
         const ZelSvcSimOperator &entry = question.entry(number);
-        const bool same = field_text(entry.mccmnc) == field_text(question.sim.mccmnc);
+        const bool same = question.match.verdicts[number] != Verdict::OtherNetwork;
         if (same != of_sims_network) continue;
         rows.push_back({question.is_chosen(number) ? "->" : "", std::to_string(number + 1), field_text(entry.mccmnc),
                         field_text(entry.network_name), reason_of(question, number)});
@@ -158,14 +172,15 @@ void print_entries(const Question &question, bool of_sims_network) {
 
 int sim_match(Invocation &invocation) {
     Question question;
+    question.reveal = invocation.reveal;
     question.sim = card_in_question(invocation);
     question.operators = operators_of(invocation, invocation.value("customer"));
     question.match = zel_svc_sim_match(question.operators.entries, question.sim);
     if (invocation.json) {
-        print_json(json_of(question, invocation.reveal));
+        print_json(json_of(question));
         return kDone;
     }
-    print_line("SIM " + card_text(question.sim, invocation.reveal) + " on a phone of " + question.operators.customer);
+    print_line("SIM " + card_text(question.sim, question.reveal) + " on a phone of " + question.operators.customer);
     print_line(headline(question));
     print_entries(question, true);
     print_entries(question, false);

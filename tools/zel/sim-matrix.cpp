@@ -16,13 +16,7 @@ bool is_digits(const std::string &text) {
     return std::all_of(text.begin(), text.end(), [](char byte) { return byte >= '0' && byte <= '9'; });
 }
 
-enum class Asks { Msin, Gid, Spn, Nothing };
-
-Asks asked_by(const ZelSvcSimOperator &entry) {
-    if (entry.subset_code[0] != '\0') return Asks::Msin;
-    if (entry.gid[0] != '\0') return Asks::Gid;
-    return entry.sp_name[0] != '\0' ? Asks::Spn : Asks::Nothing;
-}
+using Asks = ZelSvcSimAsks;
 
 class Matrix {
   public:
@@ -43,14 +37,14 @@ class Matrix {
     }
     // An entry that asks for nothing is looked at behind all that ask for something.
     [[nodiscard]] bool goes_before(std::size_t one, std::size_t other) const {
-        if (one == other || !same_network(one, other) || asked_by(entries_[one]) == Asks::Nothing) return false;
-        return one < other || asked_by(entries_[other]) == Asks::Nothing;
+        if (one == other || !same_network(one, other) || zel_svc_sim_asks(entries_[one]) == Asks::Nothing) return false;
+        return one < other || zel_svc_sim_asks(entries_[other]) == Asks::Nothing;
     }
     // First digits of MSINs that entries before this one take.
     [[nodiscard]] std::vector<std::string> taken_before(std::size_t number) const {
         std::vector<std::string> taken;
         for (std::size_t other = 0; other < entries_.size(); ++other)
-            if (goes_before(other, number) && asked_by(entries_[other]) == Asks::Msin)
+            if (goes_before(other, number) && zel_svc_sim_asks(entries_[other]) == Asks::Msin)
                 taken.push_back(field_text(entries_[other].subset_code));
         return taken;
     }
@@ -84,8 +78,8 @@ ZelSvcSimInfo Matrix::likeliest_sim(std::size_t number) const {
     // Where others take every MSIN, any will do to see who gets it.
     zel_svc_text_copy(sim.msin, sizeof sim.msin,
                       msin.empty() ? free_msin(field_text(entry.subset_code), {}, kImsiDigits - mccmnc.size()) : msin);
-    if (asked_by(entry) == Asks::Gid) zel_svc_text_copy(sim.gid, sizeof sim.gid, field_text(entry.gid));
-    if (asked_by(entry) == Asks::Spn) zel_svc_text_copy(sim.spn, sizeof sim.spn, field_text(entry.sp_name));
+    if (zel_svc_sim_asks(entry) == Asks::Gid) zel_svc_text_copy(sim.gid, sizeof sim.gid, field_text(entry.gid));
+    if (zel_svc_sim_asks(entry) == Asks::SpName) zel_svc_text_copy(sim.spn, sizeof sim.spn, field_text(entry.sp_name));
     return sim;
 }
 
@@ -97,7 +91,7 @@ Reached Matrix::of(std::size_t number) const {
     const ZelSvcSimMatch match = zel_svc_sim_match(entries_, sim);
     if (std::find(match.chosen.begin(), match.chosen.end(), number) == match.chosen.end()) {
         result.instead = match.chosen;
-        result.why = asked_by(entries_[number]) == Asks::Nothing
+        result.why = zel_svc_sim_asks(entries_[number]) == Asks::Nothing
                          ? "entries that ask for first digits of the MSIN take every SIM"
                          : "entries before it take every SIM that it asks for";
         return result;
@@ -111,8 +105,8 @@ Reached Matrix::of(std::size_t number) const {
 // Whether some SIM that has what both ask for goes to the other one.
 bool Matrix::takes_some(std::size_t other, std::size_t number) const {
     if (!goes_before(other, number)) return false;
-    const Asks asks = asked_by(entries_[number]);
-    if (asks != asked_by(entries_[other])) return true;
+    const Asks asks = zel_svc_sim_asks(entries_[number]);
+    if (asks != zel_svc_sim_asks(entries_[other])) return true;
     return asks == Asks::Msin &&
            field_text(entries_[other].subset_code).starts_with(field_text(entries_[number].subset_code));
 }

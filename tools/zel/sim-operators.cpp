@@ -6,6 +6,7 @@
 #include "sim-cards.h"
 
 #include <zel-svc-configuration-customer-path.h>
+#include <zel-svc-sim-auto-setting-match.h>
 #include <zel-svc-sim-auto-setting-operators.h>
 
 namespace zel_command {
@@ -27,6 +28,20 @@ void report_full_list(const Invocation &invocation, std::size_t count) {
 [[noreturn]] void fail_without_customer(const Invocation &invocation) {
     throw Failure{kFailed, invocation.command->name + ": the phone in '" + invocation.root + "' has no active customer",
                   "Make a customer the active one with 'zel install CUSTOMER' or 'zel imei CUSTOMER'."};
+}
+
+std::string asked_text(const ZelSvcSimOperator &entry, const std::string &msin) {
+    switch (zel_svc_sim_asks(entry)) {
+    case ZelSvcSimAsks::Msin:
+        return "MSIN " + msin;
+    case ZelSvcSimAsks::Gid:
+        return "GID " + field_text(entry.gid);
+    case ZelSvcSimAsks::SpName:
+        return "SPN " + field_text(entry.sp_name);
+    case ZelSvcSimAsks::Nothing:
+        break;
+    }
+    return {};
 }
 
 } // namespace
@@ -73,9 +88,13 @@ std::vector<CustomerOperators> operators_of_package(const Invocation &invocation
 }
 
 std::string asked_text(const ZelSvcSimOperator &entry) {
-    if (entry.subset_code[0] != '\0') return "MSIN " + field_text(entry.subset_code) + "...";
-    if (entry.gid[0] != '\0') return "GID " + field_text(entry.gid);
-    return entry.sp_name[0] == '\0' ? "" : "SPN " + field_text(entry.sp_name);
+    return asked_text(entry, field_text(entry.subset_code) + "...");
+}
+
+std::string asked_text_of_card(const ZelSvcSimOperator &entry, bool reveal) {
+    const std::string code = field_text(entry.subset_code);
+    const std::string shown = shown_first_digits(code, reveal);
+    return asked_text(entry, shown == code ? code + "..." : shown);
 }
 
 Json operator_json(const ZelSvcSimOperator &entry, std::size_t index) {
@@ -86,6 +105,12 @@ Json operator_json(const ZelSvcSimOperator &entry, std::size_t index) {
     put_text(result, "subset_code", field_text(entry.subset_code));
     put_text(result, "gid", field_text(entry.gid));
     put_text(result, "sp_name", field_text(entry.sp_name));
+    return result;
+}
+
+Json operator_json_of_card(const ZelSvcSimOperator &entry, std::size_t index, bool reveal) {
+    Json result = operator_json(entry, index);
+    put_text(result, "subset_code", shown_first_digits(field_text(entry.subset_code), reveal));
     return result;
 }
 

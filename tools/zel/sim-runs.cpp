@@ -72,8 +72,9 @@ void print_traces(const Json &slots) {
     if (result == ZEL_SVC_SIM_NO_CUSTOMER)
         throw Failure{kFailed, "sim run: the phone in '" + invocation.root + "' has no active customer",
                       "Make a customer the active one with 'zel install CUSTOMER'."};
-    throw Failure{kFailed, "sim run: SIM auto setting is off: the active customer leaves nothing to the SIM",
-                  "A full install switches it on when an Auto flag of the customer's file is \"on\"."};
+    throw Failure{kFailed, "sim run: SIM auto setting is off: 'db/private/zel/sim_auto_enable' is 0 or unreadable",
+                  "A full install switches it on when the customer's file has an Auto flag \"on\", AutoEmailAccount "
+                  "aside."};
 }
 
 int report_problems(const Invocation &invocation, const RunWatch &watch) {
@@ -162,7 +163,7 @@ int sim_install(Invocation &invocation) {
     const bool done = install_chosen(list[chosen], slot, sim, readable);
     if (invocation.json) {
         Json answer{{"slot", slot}, {"done", done}, {"sim_kept", readable}};
-        answer["operator"] = operator_json(list[chosen], chosen);
+        answer["operator"] = operator_json_of_card(list[chosen], chosen, invocation.reveal);
         print_json(answer);
     } else {
         print_line("SIM " + std::to_string(slot) + ": " + field_text(list[chosen].network_name) + " of " +

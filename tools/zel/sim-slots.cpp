@@ -79,23 +79,23 @@ ZelSvcSimOperator active_operator(int slot) {
     return entry;
 }
 
-Json active_json(int slot) {
-    Json result = operator_json(active_operator(slot), 0);
+Json active_json(const Invocation &invocation, int slot) {
+    Json result = operator_json_of_card(active_operator(slot), 0, invocation.reveal);
     result.erase("number");
     result["slot"] = slot;
     return result;
 }
 
-std::string active_text(int slot) {
+std::string active_text(const Invocation &invocation, int slot) {
     const ZelSvcSimOperator entry = active_operator(slot);
     const std::string network = field_text(entry.network_name);
     if (network.empty()) return "none";
-    const std::string asked = asked_text(entry);
+    const std::string asked = asked_text_of_card(entry, invocation.reveal);
     return network + " (" + field_text(entry.mccmnc) + (asked.empty() ? "" : ", " + asked) + ") of " +
            field_text(entry.customer_name);
 }
 
-void print_slot(const Json &slot) {
+void print_slot(const Invocation &invocation, const Json &slot) {
     const int number = slot.at("slot");
     print_line("\nSIM " + std::to_string(number));
     print_table({}, {{"  state", slot.at("state").dump()},
@@ -104,7 +104,7 @@ void print_slot(const Json &slot) {
                      {"  seen last time", known_line(slot)},
                      {"  changed", slot.at("changed") ? "yes" : "no"},
                      {"  user is asked", slot.at("user_is_asked") ? "yes" : "no"},
-                     {"  operator", active_text(number)}});
+                     {"  operator", active_text(invocation, number)}});
 }
 
 } // namespace
@@ -114,7 +114,7 @@ int sim_info(Invocation &invocation) {
     Json answer{{"feature", feature}, {"slots", Json::array()}};
     for (const int slot : chosen_slots(invocation)) {
         Json shown = slot_json(invocation, slot);
-        shown["operator"] = active_json(slot);
+        shown["operator"] = active_json(invocation, slot);
         answer["slots"].push_back(std::move(shown));
     }
     if (invocation.json) {
@@ -123,7 +123,7 @@ int sim_info(Invocation &invocation) {
     }
     print_line(std::string{"SIM auto setting is "} + kFeature[feature] + ".");
     for (const Json &slot : answer["slots"])
-        print_slot(slot);
+        print_slot(invocation, slot);
     return kDone;
 }
 
@@ -131,8 +131,8 @@ int sim_active(Invocation &invocation) {
     Json answer = Json::array();
     std::vector<std::vector<std::string>> rows;
     for (const int slot : chosen_slots(invocation)) {
-        answer.push_back(active_json(slot));
-        rows.push_back({std::to_string(slot), active_text(slot)});
+        answer.push_back(active_json(invocation, slot));
+        rows.push_back({std::to_string(slot), active_text(invocation, slot)});
     }
     if (invocation.json)
         print_json(answer);

@@ -3,7 +3,8 @@
 //
 //     zel_svc_sim_log_append(slot.check_log, zel_svc_sim_message("SIM%d normally inserted.", slot.number));
 //
-// An MSIN identifies a subscriber: no log ever holds more than its first three digits.
+// An MSIN identifies a subscriber: logs hold its first three digits, and beside them only the subset code of an
+// operator that it matched, whole.
 
 #include "base/zel-svc-text.h"
 #include "zel-svc.h"
@@ -24,7 +25,7 @@ template <std::size_t N> std::string zel_svc_sim_text(const char (&field)[N]) {
     return std::string{zel_svc_text_view(field, N)};
 }
 
-// As much of an MSIN as a log may hold.
+// As much of an MSIN as is shown of it.
 std::string zel_svc_sim_msin_shown(std::string_view msin);
 
 // "XFV_Vodacom('65501',(Subset)'',(GID)'',(SPName)'')"

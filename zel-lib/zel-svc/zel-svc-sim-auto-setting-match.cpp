@@ -12,25 +12,26 @@ using Verdict = ZelSvcSimVerdict;
 
 template <std::size_t N> std::string_view text_of(const char (&field)[N]) { return zel_svc_text_view(field, N); }
 
-char lower(char letter) { return letter >= 'A' && letter <= 'Z' ? static_cast<char>(letter - 'A' + 'a') : letter; }
-
 bool equal_but_for_case(std::string_view one, std::string_view other) {
     return std::equal(one.begin(), one.end(), other.begin(), other.end(),
-                      [](char a, char b) { return lower(a) == lower(b); });
+                      [](char a, char b) { return zel_svc_text_lower(a) == zel_svc_text_lower(b); });
 }
 
 // The first thing that an entry asks for decides; what stands behind it is not looked at.
 Verdict verdict_on(const ZelSvcSimOperator &entry, const ZelSvcSimInfo &sim) {
     const std::string_view mccmnc = text_of(sim.mccmnc);
     if (mccmnc.empty() || text_of(entry.mccmnc) != mccmnc) return Verdict::OtherNetwork;
-    const std::string_view subset = text_of(entry.subset_code);
-    if (!subset.empty())
-        return text_of(sim.msin).substr(0, subset.size()) == subset ? Verdict::Decisive : Verdict::OtherMsin;
-    const std::string_view gid = text_of(entry.gid);
-    if (!gid.empty()) return text_of(sim.gid) == gid ? Verdict::Decisive : Verdict::OtherGid;
-    const std::string_view sp_name = text_of(entry.sp_name);
-    if (sp_name.empty()) return Verdict::Plain;
-    return equal_but_for_case(text_of(sim.spn), sp_name) ? Verdict::Decisive : Verdict::OtherSpName;
+    switch (zel_svc_sim_asks(entry)) {
+    case ZelSvcSimAsks::Msin:
+        return text_of(sim.msin).starts_with(text_of(entry.subset_code)) ? Verdict::Decisive : Verdict::OtherMsin;
+    case ZelSvcSimAsks::Gid:
+        return text_of(sim.gid) == text_of(entry.gid) ? Verdict::Decisive : Verdict::OtherGid;
+    case ZelSvcSimAsks::SpName:
+        return equal_but_for_case(text_of(sim.spn), text_of(entry.sp_name)) ? Verdict::Decisive : Verdict::OtherSpName;
+    case ZelSvcSimAsks::Nothing:
+        break;
+    }
+    return Verdict::Plain;
 }
 
 std::vector<std::size_t> choice(const std::vector<Verdict> &verdicts) {
@@ -51,6 +52,12 @@ std::int32_t copy_matches(const ZelSvcSimInfo &sim, ZelSvcSimOperator *list) {
 }
 
 } // namespace
+
+ZelSvcSimAsks zel_svc_sim_asks(const ZelSvcSimOperator &entry) {
+    if (entry.subset_code[0] != '\0') return ZelSvcSimAsks::Msin;
+    if (entry.gid[0] != '\0') return ZelSvcSimAsks::Gid;
+    return entry.sp_name[0] != '\0' ? ZelSvcSimAsks::SpName : ZelSvcSimAsks::Nothing;
+}
 
 ZelSvcSimMatch zel_svc_sim_match(std::span<const ZelSvcSimOperator> operators, const ZelSvcSimInfo &sim) {
     std::vector<Verdict> verdicts;

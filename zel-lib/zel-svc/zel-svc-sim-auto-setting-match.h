@@ -9,6 +9,15 @@
 #include <span>
 #include <vector>
 
+// What an entry asks of a SIM beside its MCC and MNC: the first that it states, whatever else it states.
+enum class ZelSvcSimAsks {
+    Msin,    // its subset code: the first digits
+    Gid,     // its group identifier
+    SpName,  // its service provider name
+    Nothing, // fits every SIM of the network
+};
+ZelSvcSimAsks zel_svc_sim_asks(const ZelSvcSimOperator &entry);
+
 enum class ZelSvcSimVerdict {
     OtherNetwork, // not the SIM's MCC and MNC
     OtherMsin,    // the SIM's MSIN does not begin with the entry's subset code

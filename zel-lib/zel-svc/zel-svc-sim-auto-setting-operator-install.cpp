@@ -2,8 +2,8 @@
 // of those the entries of the operator's network.
 
 #include "base/zel-svc-guard.h"
+#include "base/zel-svc-internal-customer.h"
 #include "base/zel-svc-log.h"
-#include "base/zel-svc-text.h"
 #include "zel-svc-configuration-customer-path.h"
 #include "zel-svc-selective-pass.h"
 #include "zel-svc-sim-auto-setting-apn-reset.h"
@@ -36,15 +36,13 @@ constexpr Step kAfterProfiles[] = {
 };
 
 bool read_active_customers_flags() {
-    FixedText<10> active;
-    FixedText<10> internal;
-    constexpr auto size = static_cast<int>(active.width);
-    if (zel_svc_config_get_active_customer_name(active.data(), size) == 0) return false;
-    zel_svc_config_get_internal_customer_name(active.c_str(), internal.data(), size);
-    return zel_svc_selective_pass_read_auto_flags(zel_svc_customer_spec_path(internal.view()));
+    const ZelSvcCurrentCustomer customer = zel_svc_current_customer();
+    if (customer.code.empty()) return false;
+    return zel_svc_selective_pass_read_auto_flags(zel_svc_customer_spec_path(customer.folder.view()));
 }
 
-// What an earlier customer's file said must not decide now.
+// Without a customer or its file, what an earlier one said must not decide now. A file that was read, though not to
+// its end, is that customer's.
 void read_flags() {
     if (!zel_svc_guarded_or(false, [] { return read_active_customers_flags(); })) gbZelSvcNetworkAutoFlags.fill(0);
 }

@@ -25,15 +25,13 @@ struct CustomerFile {
     std::string path;
 };
 
-std::vector<CustomerFile> file_of_customer(std::string_view code) {
-    const std::string_view customer = zel_svc_internal_customer(code);
+std::vector<CustomerFile> file_in_folder(std::string_view customer) {
     return {{std::string{customer}, zel_svc_customer_spec_path(customer)}};
 }
 
 std::vector<CustomerFile> file_of_active_customer() {
-    FixedText<10> active;
-    if (zel_svc_config_get_active_customer_name(active.data(), static_cast<int>(active.width)) == 0) return {};
-    return file_of_customer(active.view());
+    const ZelSvcCurrentCustomer customer = zel_svc_current_customer();
+    return customer.code.empty() ? std::vector<CustomerFile>{} : file_in_folder(customer.folder.view());
 }
 
 CustomerFile file_of(const ZelSvcCustomer &customer) {
@@ -61,6 +59,7 @@ void prepare_parse() {
 void collect(const CustomerFile &file) {
     ZelSvcOperatorList &operators = zel_svc_collected_operators();
     zel_svc_text_copy(operators.customer_name, sizeof operators.customer_name, file.customer);
+    zel_svc_set_sales_code({}); // a file without GeneralInfo would keep that of the file before it
     zel_svc_spec_parse_file(ZEL_SVC_PARSE_ACTION_INSTALL, file.path.c_str(), 0);
 }
 
@@ -81,7 +80,7 @@ std::span<const ZelSvcSimOperator> zel_svc_sim_operators(ZelSvcOperatorsOf whose
 }
 
 std::span<const ZelSvcSimOperator> zel_svc_sim_operators_of(std::string_view customer) {
-    return operators_in(file_of_customer(customer));
+    return operators_in(file_in_folder(zel_svc_internal_customer(customer)));
 }
 
 void zel_svc_sim_auto_setting_get_operator_list(ZelSvcSimOperator *list, int32_t *count, int all_customers) {

@@ -3,6 +3,7 @@
 
 #include "base/zel-svc-file.h"
 #include "base/zel-svc-guard.h"
+#include "base/zel-svc-internal-customer.h"
 #include "base/zel-svc-key-text.h"
 #include "base/zel-svc-log.h"
 #include "zel-svc-sim-auto-setting-log.h"
@@ -121,13 +122,10 @@ Outcome install(const Check &check, const ZelSvcSimOperator &entry) {
 }
 
 ZelSvcSimMessage not_found_text() {
-    FixedText<10> active;
-    FixedText<10> internal;
-    constexpr auto size = static_cast<int>(active.width);
-    zel_svc_config_get_active_customer_name(active.data(), size);
-    if (zel_svc_config_get_internal_customer_name(active.c_str(), internal.data(), size) == 1)
-        return zel_svc_sim_message("Operator in %s spec(active:%s) not found, skip.", internal.c_str(), active.c_str());
-    return zel_svc_sim_message("Operator in %s spec not found, skip.", active.c_str());
+    const ZelSvcCurrentCustomer customer = zel_svc_current_customer();
+    const char *code = customer.code.c_str();
+    if (!customer.shares_folder) return zel_svc_sim_message("Operator in %s spec not found, skip.", code);
+    return zel_svc_sim_message("Operator in %s spec(active:%s) not found, skip.", customer.folder.c_str(), code);
 }
 
 // The same SIM is not looked at again.

@@ -14,6 +14,11 @@ std::size_t zel_svc_text_cut(std::string_view text, std::size_t limit);
 // first NUL byte. A size of 0 touches nothing.
 void zel_svc_text_copy(char *target, std::size_t size, std::string_view text);
 
+// The letters A to Z in lower case, everything else as it is, whatever the locale.
+constexpr char zel_svc_text_lower(char byte) {
+    return byte >= 'A' && byte <= 'Z' ? static_cast<char>(byte - 'A' + 'a') : byte;
+}
+
 // The bytes of a buffer whose size a caller of the interface gives; a size below 0 is none.
 constexpr std::size_t zel_svc_buffer_size(int size) { return size > 0 ? static_cast<std::size_t>(size) : 0; }
 

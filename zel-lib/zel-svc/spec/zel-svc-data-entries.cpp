@@ -1,5 +1,7 @@
 #include "spec/zel-svc-data-entries.h"
 
+#include "base/zel-svc-text.h"
+
 #include <algorithm>
 #include <iterator>
 #include <utility>
@@ -9,8 +11,7 @@ namespace {
 // As the INI library does it: other letters than A to Z are left alone.
 std::string lower_case(std::string_view name) {
     std::string lower{name};
-    std::transform(lower.begin(), lower.end(), lower.begin(),
-                   [](char c) { return c >= 'A' && c <= 'Z' ? static_cast<char>(c - 'A' + 'a') : c; });
+    std::transform(lower.begin(), lower.end(), lower.begin(), zel_svc_text_lower);
     return lower;
 }
 
