@@ -1,6 +1,7 @@
 // The bench phone's sync agent, through its client functions and through the verbs.
 
 #include "support/bench-phone.h"
+#include "support/sqlite-file.h"
 
 #include <gmock/gmock.h>
 #include <sync-agent.h>
@@ -91,6 +92,27 @@ TEST_F(SyncAgent, GivesItsProfilesInOrderAndDeletesThem) {
     free_all(profiles);
     EXPECT_EQ(accounts().size(), 2U);
     EXPECT_EQ(accounts().at(1).at("name"), "c");
+}
+
+// The data base refuses the second half of a removal.
+TEST_F(SyncAgent, KeepsTheServicesOfAnAccountThatItCannotRemove) {
+    call("sync-accounts-add", {{"name", "kept"}, {"contacts", true}, {"contacts-name", "con"}});
+    const json before = accounts();
+    ASSERT_EQ(sync_agent_ds_init(), 0);
+    GList *profiles = nullptr;
+    ASSERT_EQ(sync_agent_ds_get_all_profile(&profiles), 0);
+    ASSERT_EQ(g_list_length(profiles), 1U);
+    const zel_test::SqliteFile state{root() + "/.platform/state.db"};
+    state.run("CREATE TRIGGER no_removal BEFORE DELETE ON sync_account BEGIN SELECT RAISE(ABORT, 'refused'); END");
+    EXPECT_NE(sync_agent_ds_delete_profile(static_cast<Profile *>(g_list_nth_data(profiles, 0))), 0);
+    zel_host_phone *phone = zel_host_open(root().c_str(), nullptr);
+    EXPECT_EQ(zel_host_call(phone, "sync-accounts-clear", nullptr, nullptr), 1);
+    zel_host_close(phone);
+    EXPECT_EQ(accounts(), before);
+    state.run("DROP TRIGGER no_removal");
+    EXPECT_EQ(sync_agent_ds_delete_profile(static_cast<Profile *>(g_list_nth_data(profiles, 0))), 0);
+    EXPECT_THAT(accounts(), IsEmpty());
+    free_all(profiles);
 }
 
 TEST_F(SyncAgent, GivesNoListWithoutProfiles) {
