@@ -8,7 +8,9 @@
 namespace zel_host {
 namespace {
 
-constexpr int kNoPicture = 1; // the theme service's error number here
+// The theme service's error numbers here.
+constexpr int kNoPicture = 1;
+constexpr int kNotReserved = 2; // something in the argument that is to be null
 
 int count_toolkit(Phone &phone, int step) {
     const std::int64_t users = recorded_number(phone, "toolkit_users") + step;
@@ -38,8 +40,8 @@ ZEL_HOST_EXPORT int elm_shutdown(void) {
     return answer<function("elm_shutdown")>([](Phone &phone) { return count_toolkit(phone, -1); });
 }
 
-ZEL_HOST_EXPORT int uxt_theme_set_suitable_system_color_info_from_image(const char *path, int kind,
-                                                                        void * /*reserved*/) {
+ZEL_HOST_EXPORT int uxt_theme_set_suitable_system_color_info_from_image(const char *path, int kind, void *reserved) {
     return answer<function("uxt_theme_set_suitable_system_color_info_from_image")>(
-        [&](Phone &phone) { return derive_colors(phone, path, kind); }, path, kind);
+        [&](Phone &phone) { return reserved == nullptr ? derive_colors(phone, path, kind) : kNotReserved; }, path,
+        kind);
 }

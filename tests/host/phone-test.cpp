@@ -194,6 +194,8 @@ TEST_F(Phone, DisplayAndThemeAreRecorded) {
     EXPECT_GT(elm_init(0, nullptr), 0);
     EXPECT_EQ(uxt_theme_set_suitable_system_color_info_from_image("/opt/picture.png", 2, nullptr), 0);
     EXPECT_NE(uxt_theme_set_suitable_system_color_info_from_image("/opt/none.png", 2, nullptr), 0);
+    int anything = 0;
+    EXPECT_NE(uxt_theme_set_suitable_system_color_info_from_image("/opt/picture.png", 1, &anything), 0);
     elm_shutdown();
     EXPECT_EQ(call("status").at("theme_picture"), "/opt/picture.png");
     EXPECT_EQ(call("status").at("theme_kind"), 2);

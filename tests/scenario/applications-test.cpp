@@ -3,6 +3,7 @@
 #include "service-phone.h"
 #include "support/operator-apps.h"
 
+#include <filesystem>
 #include <gmock/gmock.h>
 
 namespace {
@@ -64,6 +65,30 @@ TEST_F(Apps, WithoutListsNothingIsInstalled) {
     EXPECT_TRUE(exists(kAppFolder));
     EXPECT_FALSE(exists(std::string{kAppFolder} + "/applist.ini"));
     EXPECT_EQ(laps().at(4), "App");
+}
+
+TEST_F(Apps, AListThatCannotBeCopiedCountsAsNone) {
+    write_list("DEF", "applist_def.ini", "com.example.notes");
+    write_list("BTU", "applist.ini", "com.example.map");
+    fail("disk_full", std::string{kAppFolder} + "/applist_def.ini");
+    fail("disk_full", std::string{kAppFolder} + "/applist.ini");
+    call("journal-start");
+    zel_svc_config_install_customer("BTU", ZEL_SVC_INSTALL_CONFIG_MODE);
+    const auto none = {"[Config] Default applist not existed.", "[Config] Customer applist not existed.",
+                       "[Config] No need to disable App as default."};
+    EXPECT_THAT(lines_with("pp"), ::testing::IsSupersetOf(none));
+    EXPECT_THAT(lines_with("Install default App"), IsEmpty());
+    EXPECT_THAT(commands(), IsEmpty());
+}
+
+TEST_F(Apps, WithoutTheirFolderNothingIsInstalled) {
+    write_list("DEF", "applist_def.ini", "com.example.notes");
+    write_list("BTU", "applist.ini", "com.example.map");
+    std::filesystem::remove_all(root() + kAppFolder);
+    call("journal-start");
+    zel_svc_config_install_customer("BTU", ZEL_SVC_INSTALL_CONFIG_MODE);
+    EXPECT_TRUE(logged_in_order({"[Config] Default applist not existed.", "[Config] Customer applist not existed."}));
+    EXPECT_THAT(commands(), IsEmpty());
 }
 
 TEST_F(Apps, AFailedToolIsIgnored) {
@@ -160,6 +185,24 @@ TEST_F(OperatorApps, AFullInstallDisablesWhateverIsThere) {
         EXPECT_TRUE(lines_with("App existence").empty());
         EXPECT_TRUE(lines_with("manually").empty());
     }
+}
+
+TEST_F(OperatorApps, AreDisabledBehindTheLapOfTheLists) {
+    prepare(1);
+    write_default_list();
+    call("journal-start");
+    zel_svc_config_install_customer("INS", ZEL_SVC_INSTALL_CONFIG_MODE);
+    const nlohmann::json journal = call("journal-list");
+    std::vector<std::string> found; // the commands and the written laps between them
+    for (const auto &entry : journal.at("calls")) {
+        const bool command = entry.at("function") == "zel_platform_command";
+        const bool lap = entry.at("text") == kLapLog && !found.empty() && found.back() != "lap";
+        if (command || lap) found.push_back(lap ? "lap" : entry.at("text").get<std::string>());
+    }
+    ASSERT_GE(found.size(), 3U);
+    EXPECT_TRUE(found[0].starts_with("/usr/bin/pkgcmd ")) << found[0];
+    EXPECT_EQ(found[1], "lap");
+    EXPECT_EQ(found[2], "/usr/bin/pkg -d com.skatamfa.beats");
 }
 
 TEST_F(OperatorApps, ARefusedDisableShowsItsStatus) {

@@ -223,12 +223,22 @@ TEST_P(CodeWithoutFolder, InstallsNothingAndWritesAllLines) {
     for (const char *folder : {"", "preconfig/", "preconfig/a/b/"}) {
         write("/opt/system/zel/" + std::string(folder) + "power-ani/poweron.edj", "");
         write("/opt/system/zel/" + std::string(folder) + "usr/file", "");
+        write("/opt/system/zel/" + std::string(folder) + "preset/zel-preset.ini", "[default]\nlockscreen_theme = 1\n");
+        write("/opt/system/zel/" + std::string(folder) + "fsupdate/fs/opt/copied", "");
+        write("/opt/system/zel/" + std::string(folder) + "fsupdate/zel-fsupdate.ini",
+              "[rel]\nversion = 3\n1_rm = /opt/kept\n");
+        write("/opt/system/zel/" + std::string(folder) + "app/applist.ini", "[zel packages]\nname_001 = a\n");
     }
+    write("/opt/kept", "");
     write("/poweron.edj", "");
     zel_svc_config_install_customer(GetParam(), ZEL_SVC_INSTALL_CONFIG_MODE);
     EXPECT_EQ(get_string("db/zel/country_iso"), std::nullopt);
     EXPECT_EQ(get_string("db/zel/power_ani_file_path"), std::nullopt);
     EXPECT_FALSE(exists("/opt/system/zel-default/usr/file"));
+    EXPECT_EQ(get_int("db/lockscreen/style"), std::nullopt);
+    EXPECT_FALSE(exists("/opt/copied"));
+    EXPECT_TRUE(exists("/opt/kept"));
+    EXPECT_TRUE(logged("[Config] Customer applist not existed."));
     const std::string name = GetParam();
     EXPECT_TRUE(logged_in_order({
         "[Config/Start] Install customer('" + name + "') to install full configuration on Config mode.",

@@ -13,6 +13,8 @@ const std::string kWallpapers = "/opt/usr/share/settings/Wallpapers/";
 constexpr const char *kProductCode = "/csa/imei/prodcode.dat";
 const std::string kTag = "[Config][DefaultWallpaperByHWColor] ";
 
+constexpr const char *kNotOpened = "Product code not opened, default not set.";
+
 // The phase's lines between its first and its last, without their tag.
 class Wallpaper : public zel_test::ServicePhone {
   protected:
@@ -29,6 +31,7 @@ class Wallpaper : public zel_test::ServicePhone {
 
     std::vector<std::string> run_again(int kind = ZEL_SVC_INSTALL_CONFIG_MODE) {
         write("/opt/system/zel-default/output/zel-config.log", "");
+        const std::size_t told_before = system_log().size();
         zel_svc_config_install_customer("BTU", kind);
         std::vector<std::string> lines = run_log_lines();
         const auto first =
@@ -38,6 +41,22 @@ class Wallpaper : public zel_test::ServicePhone {
         std::vector<std::string> found;
         for (auto line = first + 1; line != last; ++line)
             found.push_back(line->starts_with(kTag) ? line->substr(kTag.size()) : *line);
+        EXPECT_EQ(told_since(told_before), found == std::vector<std::string>{kNotOpened}
+                                               ? std::vector<std::string>{"fopen() for Product code failed."}
+                                               : found);
+        return found;
+    }
+
+    // The phase's lines in the system log: the same as in the run log, one excepted.
+    std::vector<std::string> told_since(std::size_t before) {
+        std::vector<std::string> found;
+        const std::vector<std::string> log = system_log();
+        for (std::size_t i = before; i < log.size(); ++i) {
+            const std::size_t tag = log[i].find(kTag);
+            if (tag == std::string::npos) continue;
+            const std::string text = log[i].substr(tag + kTag.size());
+            found.push_back(text.substr(0, text.find('\n')));
+        }
         return found;
     }
 
@@ -68,6 +87,18 @@ TEST_F(Wallpaper, OfABlackHandsetIsSwapped) {
     EXPECT_EQ(call("status").at("theme_picture"), kWallpapers + "Home_default.png");
     EXPECT_EQ(call("status").at("theme_kind"), 2);
     EXPECT_EQ(call("status").at("toolkit_users"), 0);
+}
+
+TEST_F(Wallpaper, ItsColoursAreSetWhileTheToolkitRuns) {
+    call("journal-start");
+    run(code("Q7N0", "ZK"));
+    const nlohmann::json journal = call("journal-list");
+    std::vector<std::string> found;
+    for (const auto &entry : journal.at("calls")) {
+        const std::string name = entry.at("function");
+        if (name.starts_with("elm_") || name.starts_with("uxt_")) found.push_back(name);
+    }
+    EXPECT_THAT(found, ElementsAre("elm_init", "uxt_theme_set_suitable_system_color_info_from_image", "elm_shutdown"));
 }
 
 TEST_F(Wallpaper, OfAWhiteHandsetIsSwapped) {
@@ -112,7 +143,7 @@ TEST_F(Wallpaper, WithoutAProductCodeNothingIsDone) {
 
 TEST_F(Wallpaper, AProductCodeThatDoesNotOpenEndsThePhase) {
     write(std::string{kProductCode} + "/folder", "");
-    EXPECT_THAT(run_again(), ElementsAre("Product code not opened, default not set."));
+    EXPECT_THAT(run_again(), ElementsAre(kNotOpened));
     EXPECT_TRUE(system_logged(kTag + "fopen() for Product code failed."));
     EXPECT_FALSE(system_logged(kTag + "Product code not opened, default not set.\n"));
 }

@@ -261,6 +261,8 @@ TEST_F(FsUpdate, PathsThatAreNoneOfThePhonesDoNothing) {
     write("/opt/file", "kept");
     write("/opt/folder/file", "kept");
     write_tree("DEF", "/opt/file", "tree");
+    write_script("DEF", "[rel]\n");
+    write("/opt/system/zel-default/output/zel-config.log", "");
     const std::vector<std::string> before = tree("/opt");
     for (const char *path :
          {"opt/file", "/opt/../opt/file", "/..", "/opt/folder/..", "../opt/file", "/opt/folder/../file", "/", "//",
@@ -274,7 +276,58 @@ TEST_F(FsUpdate, PathsThatAreNoneOfThePhonesDoNothing) {
             EXPECT_EQ(read("/opt/file"), "kept") << operation << ' ' << path;
             EXPECT_EQ(read("/opt/folder/file"), "kept") << operation << ' ' << path;
         }
-    EXPECT_THAT(tree("/opt"), ::testing::IsSupersetOf(before));
+    EXPECT_THAT(tree("/opt"), ::testing::UnorderedElementsAreArray(before));
+}
+
+TEST_F(FsUpdate, AFolderIsCopiedToNoOtherPlaceThanItsOwn) {
+    write("/opt/folder/file", "kept");
+    write_tree("DEF", "/opt/folder/file", "tree");
+    write_tree("DEF", "/opt/new/inner/file", "tree");
+    write_script("DEF", "[up_always]\n1_cp_r = opt/folder\n2_cp_r = /opt/folder/..\n3_cp_r = /opt/../opt/folder\n"
+                        "4_cp_r = ..\n5_cp_r = folder\n6_cp_r = .\n7_cp_r = /opt/new/inner\n8_cp_r = /opt/none\n");
+    remember(0, 0);
+    write("/opt/system/zel-default/output/zel-config.log", "");
+    const std::vector<std::string> before = tree("/");
+    zel_svc_fs_update("XFV", 1);
+    EXPECT_THAT(tree("/"), ::testing::UnorderedElementsAreArray(before));
+    EXPECT_EQ(read("/opt/folder/file"), "kept");
+    std::string expected;
+    for (int i = 1; i <= 8; ++i)
+        expected += line("DEF/up_always:" + std::to_string(i) + "_cp_r");
+    EXPECT_EQ(run_log(), expected);
+}
+
+TEST_F(FsUpdate, ALinkIsRemovedAndNotWhatItNames) {
+    write("/opt/target/file", "kept");
+    link_to("/opt/target/file", "/opt/to-file");
+    link_to("/opt/target", "/opt/to-folder");
+    link_to("/opt/none", "/opt/to-none");
+    write_script("DEF", "[up_always]\n1_rm = /opt/to-file\n2_rm = /opt/to-folder\n3_rm = /opt/to-none\n");
+    remember(0, 0);
+    zel_svc_fs_update("XFV", 1);
+    for (const char *link : {"/opt/to-file", "/opt/to-folder", "/opt/to-none"})
+        EXPECT_FALSE(exists(link)) << link;
+    EXPECT_EQ(read("/opt/target/file"), "kept");
+}
+
+TEST_F(FsUpdate, AnUpgradeWritesTheStateFileInItsPlace) {
+    remember(1, 1);
+    const ino_t before = status_of(kState).st_ino;
+    write_script("DEF", "[up_1]\nversion = 2\n");
+    zel_svc_fs_update("XFV", 1);
+    EXPECT_EQ(versions(), "DEF 2, XFV 1");
+    EXPECT_EQ(status_of(kState).st_ino, before);
+}
+
+TEST_F(FsUpdate, AFullDiskKeepsTheVersionsOfAnUpgradeOnly) {
+    remember(1, 1);
+    write("/opt/old", "old");
+    write_script("DEF", "[up_1]\nversion = 2\n1_rm = /opt/old\n");
+    fail("disk_full", kState);
+    zel_svc_fs_update("XFV", 1);
+    EXPECT_FALSE(exists("/opt/old"));
+    EXPECT_EQ(versions(), "DEF 1, XFV 1");
+    EXPECT_EQ(run_log(), line("DEF/up_1:1_rm"));
 }
 
 TEST_F(FsUpdate, AnOperationOfTheOtherKindDoesNothing) {

@@ -1,9 +1,13 @@
 // Presets: two files merged into one, and what each row sets.
 
+#include "preset/zel-svc-preset-merge.h"
 #include "preset/zel-svc-preset.h"
 #include "support/files-phone.h"
 
 #include <gmock/gmock.h>
+
+#include <csignal>
+#include <sys/resource.h>
 
 namespace {
 
@@ -265,6 +269,20 @@ TEST_P(FailedMerge, AppliesNothing) {
 }
 
 INSTANTIATE_TEST_SUITE_P(By, FailedMerge, ::testing::Values("zel_platform_open", "disk_full"));
+
+TEST_F(Preset, AMergedFileThatFallsShortIsNotMerged) {
+    std::string text = "[default]\n";
+    for (const Expected &row : kStrings)
+        text += std::string{row.key} + " = \"" + std::string(900, 'x') + "\"\n";
+    write_presets("XFV", text);
+    ZelSvcPresetFlags chosen = {};
+    EXPECT_TRUE(zel_svc_preset_merge("XFV", 0, chosen));
+    std::signal(SIGXFSZ, SIG_IGN);
+    const rlimit limit = {.rlim_cur = 8192, .rlim_max = RLIM_INFINITY};
+    ASSERT_EQ(::setrlimit(RLIMIT_FSIZE, &limit), 0);
+    EXPECT_FALSE(zel_svc_preset_merge("XFV", 0, chosen));
+    EXPECT_EQ(status_of(kMerged).st_size, 8192);
+}
 
 TEST_F(Preset, WithoutItsFolderNothingIsApplied) {
     std::filesystem::remove_all(on_disk("/opt/system/zel-default/preset"));
