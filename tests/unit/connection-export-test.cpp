@@ -2,6 +2,8 @@
 
 #include "connections.h"
 
+#include "zel-svc-element-act-connection-profile.h"
+
 #include <gmock/gmock.h>
 
 namespace zel_test {
@@ -85,6 +87,11 @@ constexpr ExpectedText kTexts[] = {
     {"auth_type=2", 8, "secure"},
     {"auth_type=3", 8, ""},
     {"auth_type=4294967297", 8, ""},
+    {"auth_type=1e19", 8, ""},
+    {"auth_type=-1e19", 8, ""},
+    {"auth_type=9e999", 8, ""},
+    {"auth_type=-9e999", 8, ""},
+    {"auth_type=2.0", 8, "secure"},
     {"apn='a.b'", 9, "a.b"},
     {"auth_id='me'", 10, "me"},
     {"auth_pwd='x & y'", 11, "x & y"},
@@ -110,6 +117,7 @@ constexpr ExpectedText kTexts[] = {
     {"proxy_ip_addr='p:99999999999'", 13, "p"},
     {"is_static_ip_addr=1", 15, "on"},
     {"is_static_ip_addr=2", 15, "off"},
+    {"is_static_ip_addr=0.00001", 15, "off"},
     {"ip_addr='1.2.3.4'", 16, "1.2.3.4"},
     {"is_static_dns_addr=1", 17, "on"},
     {"is_static_dns_addr=0", 17, "off"},
@@ -148,6 +156,19 @@ TEST_F(ConnectionExport, PlainRowAndItsNetwork) {
                                               "", "", "", "", "", "off", "", "off", "", ""));
 }
 
+TEST_F(ConnectionExport, ProfileIsReadWithItsNetworksMccMnc) {
+    ZelSvcApnProfile read;
+    ASSERT_TRUE(__zel_svc_connection_read_profile(1, read));
+    EXPECT_EQ(read.network_name.view(), "One");
+    EXPECT_EQ(read.mccmnc.view(), "26201");
+    run("update network_info set mccmnc='123456789012'");
+    ASSERT_TRUE(__zel_svc_connection_read_profile(1, read));
+    EXPECT_EQ(read.mccmnc.view(), "123456789");
+    run("delete from network_info");
+    ASSERT_TRUE(__zel_svc_connection_read_profile(1, read));
+    EXPECT_EQ(read.mccmnc.view(), "");
+}
+
 TEST_F(ConnectionExport, NetworkThatIsGoneLeavesItsNameEmpty) {
     run("delete from network_info");
     begin_export();
@@ -175,13 +196,16 @@ TEST_F(ConnectionExport, MissingProfileIsEmptyAndNotHalfOfOne) {
     begin_export();
     EXPECT_THAT(export_profile(), Each(StrEq("")));
     EXPECT_EQ(export_profile()[0], "One");
-    for (const char *statement : {"select * from pdp_profile", "select network_name, mccmnc"}) {
+    zel_svc_data_set_int(ZEL_SVC_DATA_CONNECTION, "spec", "profile_id_1", 4);
+    for (const ReadFault &fault : kReadFaults) {
         call("fault-clear");
-        fail("sqlite3_step", statement);
-        zel_svc_data_set_int(ZEL_SVC_DATA_CONNECTION, "spec", "profile_id_1", 4);
+        fail(fault.function, fault.text, fault.from, 1);
         begin_export();
-        EXPECT_THAT(export_profile(), Each(StrEq(""))) << statement;
+        EXPECT_THAT(export_profile(), Each(StrEq(""))) << fault.function << " " << fault.text << " " << fault.from;
     }
+    call("fault-clear");
+    begin_export();
+    EXPECT_EQ(export_profile()[0], "One");
     EXPECT_EQ(open_databases(), 0U);
 }
 

@@ -152,7 +152,7 @@ TEST_F(ConnectionFaults, FileThatIsNoDatabaseStaysAsItIs) {
     expect_nothing_mirrored();
 }
 
-TEST_F(ConnectionFaults, LockedDatabaseIsNotWaitedFor) {
+TEST_F(ConnectionFaults, LockedDatabaseGrowsNoRow) {
     {
         const SqliteFile other{file()};
         other.run("begin exclusive");

@@ -283,6 +283,19 @@ TEST_F(ConnectionHandle, ExportGivesThePhonesDefaultsOfEachHandleInTurn) {
     EXPECT_EQ(count(), "0");
 }
 
+TEST_F(ConnectionHandle, DefaultWithoutANameIsShownAsNone) {
+    put_defaults();
+    run("update pdp_profile set profile_name=null where svc_category_id=1");
+    EXPECT_THAT(verify(tag("ProfBrowser", "Web") + tag("ProfMMS", "Default 2")),
+                ElementsAre(failed("[ProfBrowser] Spec='Web',Phone=''"),
+                            passed("[ProfMMS] Spec='Default 2',Phone='Default 2'")));
+    install_connections(browser("One", "Web"));
+    export_start(ZEL_SVC_ELEMENT_PROFILE_HANDLE);
+    EXPECT_EQ(export_value(ZEL_SVC_ELEMENT_PROF_BROWSER), "");
+    EXPECT_EQ(export_value(ZEL_SVC_ELEMENT_PROF_MMS), "Default 2");
+    export_end(ZEL_SVC_ELEMENT_PROFILE_HANDLE);
+}
+
 TEST_F(ConnectionHandle, ExportOutsideAHandleSaysNothing) { EXPECT_EQ(export_value(ZEL_SVC_ELEMENT_PROF_BROWSER), ""); }
 
 } // namespace zel_test

@@ -72,6 +72,16 @@ TEST_F(ConnectionService, UsersDefaultIsKept) {
     EXPECT_EQ(profiles(kService), (SqliteRows{{"Mine", "1", "1"}, {"Web", "1", "0"}, {"Pictures", "2", "1"}}));
 }
 
+// The users' default counts also under another network of the MCC+MNC.
+TEST_F(ConnectionService, DefaultOfAnotherNetworkOfTheMccMncIsOne) {
+    put_users_default();
+    run("insert into network_info values(9, 'Too', '26201'); update pdp_profile set network_info_id=9");
+    add_network("One", "26201");
+    install_connections(handle("One", kWeb) + profile("One", "Web"));
+    EXPECT_EQ(profiles("profile_name, network_info_id, default_internet_con"),
+              (SqliteRows{{"Mine", "9", "1"}, {"Web", "7", "0"}}));
+}
+
 TEST_F(ConnectionService, DefaultsBelowOneAndNullsAreNone) {
     put_users_default();
     add_network("One", "26201");

@@ -157,6 +157,7 @@ TEST_F(ConnectionStore, OnlyAnInstallForgetsWhatItHasCleaned) {
     add_network("One", "26201");
     install_connections(profile("One", "First"));
     verify_spec(connections(""));
+    parse_spec(connections(""), ZEL_SVC_PARSE_ACTION_ENCODE, ZEL_SVC_PARSE_MODE_FULL);
     install_spec(profile("One", "Second"));
     EXPECT_EQ(profiles("profile_name"), (SqliteRows{{"First"}, {"Second"}}));
 }

@@ -37,6 +37,8 @@ const std::vector<ExpectedLine> kLines{
     {"profile_enable=7", tag("EnableStatus", "enable"), passed("[Profile1/EnableStatus] Spec='enable',Phone='enable'")},
     {"profile_enable=0", tag("EnableStatus", "enable"),
      failed("[Profile1/EnableStatus] Spec='enable',Phone='disable'")},
+    {"profile_enable=1", tag("EnableStatus", "disable"),
+     failed("[Profile1/EnableStatus] Spec='disable',Phone='enable'")},
     {"profile_enable=0", tag("EnableStatus", "disable"),
      passed("[Profile1/EnableStatus] Spec='disable',Phone='disable'")},
     {"hidden=1", tag("HiddenStatus", "hidden"), passed("[Profile1/HiddenStatus] Spec='hidden',Phone='hidden'")},
@@ -68,6 +70,7 @@ const std::vector<ExpectedLine> kLines{
     {"auth_type=3", tag("Auth", "secure"), failed("[Profile1/Auth] Spec='secure',Phone=''")},
     {"auth_id='me'", tag("PSparam", tag("UserId", "me")), passed("[Profile1/UserId] Spec='me',Phone='me'")},
     {"auth_id='me'", "", failed("[Profile1/UserId] Spec='',Phone='me'")},
+    {"auth_id=''", tag("PSparam", tag("UserId", "me")), failed("[Profile1/UserId] Spec='me',Phone=''")},
     {"auth_id=''", "", passed("[Profile1/UserId] Spec='',Phone=''")},
     {"auth_pwd='x'", tag("PSparam", tag("Password", "x")), passed("[Profile1/Password] Spec='x',Phone='x'")},
     {"auth_pwd='y'", tag("PSparam", tag("Password", "x")), failed("[Profile1/Password] Spec='x',Phone='y'")},
@@ -122,6 +125,9 @@ const std::vector<ExpectedLine> kLines{
     {"dns_addr1='8.8.8.8'", tag("DNS", tag("IPAddr", "9.9.9.9")),
      failed("[Profile1/DNS/IPAddr1] Spec='9.9.9.9',Phone='8.8.8.8'")},
     {"dns_addr1='0.0.0.0'", "", passed("[Profile1/DNS/IPAddr1] Spec='',Phone='0.0.0.0'")},
+    {"dns_addr1=null", tag("DNS", tag("IPAddr", "0.0.0.0")), failed("[Profile1/DNS/IPAddr1] Spec='0.0.0.0',Phone=''")},
+    {"dns_addr2=null", tag("DNS", tag("IPAddr", "8.8.8.8") + tag("IPAddr", "0.0.0.0")),
+     failed("[Profile1/DNS/IPAddr2] Spec='0.0.0.0',Phone=''")},
     {"dns_addr1='8.8.8.8'", "", failed("[Profile1/DNS/IPAddr1] Spec='',Phone='8.8.8.8'")},
     {"dns_addr2='9.9.9.9'", tag("DNS", tag("IPAddr", "8.8.8.8") + tag("IPAddr", "9.9.9.9")),
      passed("[Profile1/DNS/IPAddr2] Spec='9.9.9.9',Phone='9.9.9.9'")},
@@ -255,14 +261,11 @@ TEST_F(ConnectionVerify, NothingIsSaidOfAProfileThatCannotBeRead) {
     know(1, -4);
     EXPECT_THAT(verify(""), IsEmpty());
     know(1, 4);
-    for (const char *statement : {"select * from pdp_profile", "select network_name, mccmnc"}) {
+    for (const ReadFault &fault : kReadFaults) {
         call("fault-clear");
-        fail("sqlite3_step", statement);
-        EXPECT_THAT(verify(""), IsEmpty()) << statement;
+        fail(fault.function, fault.text, fault.from, 1);
+        EXPECT_THAT(verify(""), IsEmpty()) << fault.function << " " << fault.text << " " << fault.from;
     }
-    call("fault-clear");
-    fail("db_util_open", ZEL_SVC_NETWORK_DB_PATH_SIM1);
-    EXPECT_THAT(verify(""), IsEmpty());
     call("fault-clear");
     EXPECT_EQ(verify("").size(), 13U);
     run("drop table network_info");

@@ -46,6 +46,19 @@ inline void set_operator(std::string_view network_name, std::string_view mccmnc)
     zel_svc_text_copy(current.mccmnc, sizeof current.mccmnc, mccmnc);
 }
 
+// What keeps a profile's row from being read, each struck once.
+struct ReadFault {
+    const char *function;
+    const char *text;
+    int from;
+};
+inline constexpr ReadFault kReadFaults[] = {
+    {"db_util_open", ZEL_SVC_NETWORK_DB_PATH_SIM1, 1},       // the profile's and its network's connection
+    {"sqlite3_prepare_v2", ZEL_SVC_NETWORK_DB_PATH_SIM1, 1}, // the profile
+    {"sqlite3_step", "select * from pdp_profile", 1},
+    {"sqlite3_step", "select network_name, mccmnc", 1},
+};
+
 class ConnectionPhone : public BenchPhone {
   protected:
     void SetUp() override {

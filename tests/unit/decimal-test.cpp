@@ -8,7 +8,7 @@ namespace {
 
 struct Reading {
     const char *text;
-    std::int32_t thousandths;
+    std::int32_t number;
 };
 
 constexpr std::int32_t kLargest = 2147483647;
@@ -65,7 +65,7 @@ constexpr Reading kReadings[] = {
 
 TEST(Thousandths, AreCutFromTheExactDecimalText) {
     for (const Reading &reading : kReadings)
-        EXPECT_EQ(zel_svc_thousandths_from_text(reading.text), reading.thousandths) << reading.text;
+        EXPECT_EQ(zel_svc_thousandths_from_text(reading.text), reading.number) << reading.text;
 }
 
 TEST(Thousandths, EndWithTheirText) {
@@ -100,6 +100,26 @@ constexpr Showing kShowings[] = {
     {16777217, "16777.2"},
     {kLargest, "2.14748e+06"},
 };
+
+TEST(Decimals, AreCutToTheirWholeNumber) {
+    const Reading readings[] = {
+        {"7", 7},
+        {"-7", -7},
+        {"2.9", 2},
+        {"-2.9", -2},
+        {"1.0e-05", 0},
+        {"1.0e+3", 1000},
+        {"1.0e+19", kLargest},
+        {"-1.0e+19", kSmallest},
+        {"word", 0},
+        {"", 0},
+        {"2147483647.9", kLargest},
+        {"2147483648", kLargest},
+        {"-2147483649", kSmallest},
+    };
+    for (const Reading &reading : readings)
+        EXPECT_EQ(zel_svc_whole_from_text(reading.text), reading.number) << reading.text;
+}
 
 TEST(Thousandths, AreShownInSixDigits) {
     for (const Showing &showing : kShowings)

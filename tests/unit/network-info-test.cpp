@@ -268,6 +268,12 @@ TEST_F(NetworkInfo, MaximumOfMinusOneGivesZero) {
     EXPECT_EQ(rows(), (SqliteRows{{"-1", "Minus", "20801"}, {"0", "One", "26201"}}));
 }
 
+TEST_F(NetworkInfo, MaximumBelowMinusOneGoesOnBelowZero) {
+    run("insert into network_info values(-5, 'Minus', '20801')");
+    EXPECT_EQ(get_id("One", "26201", kCreate), (Answer{1, -4}));
+    EXPECT_EQ(rows(), (SqliteRows{{"-5", "Minus", "20801"}, {"-4", "One", "26201"}}));
+}
+
 TEST_F(NetworkInfo, DeleteAllEmptiesTheTable) {
     EXPECT_EQ(__zel_svc_network_info_delete_all(), 1);
     run("insert into network_info values(1, 'One', '26201'), (2, 'Two', '26202')");

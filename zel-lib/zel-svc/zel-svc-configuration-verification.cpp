@@ -1,4 +1,4 @@
-// Whether the phone is what its customer's specification says.
+// Whether the phone is what its customer's file says.
 
 #include "zel-svc-configuration-verification.h"
 

@@ -40,7 +40,8 @@ std::string word(ZelSvcElementId element, std::int32_t number) {
     return zel_svc_accepts_text(field->rules.accepts, number).value_or("");
 }
 
-const char *choice(bool first, const char *yes, const char *no) { return first ? yes : no; }
+// Of the two words of a switch.
+std::string switch_word(ZelSvcElementId element, bool is_on) { return word(element, is_on ? 1 : 0); }
 
 bool is_port(std::string_view text) {
     if (text.empty() || text.find_first_not_of("0123456789") != std::string_view::npos) return false;
@@ -71,12 +72,14 @@ void fill_words(const NetworkStatement &row, Profile &profile) {
     profile.auth.assign(word(ZEL_SVC_ELEMENT_AUTH, row.integer(kAuthType)));
     profile.ip_version.assign(word(ZEL_SVC_ELEMENT_IP_VERSION, row.integer(kPdpProtocol)));
     profile.roaming_ip_version.assign(word(ZEL_SVC_ELEMENT_ROAMING_IP_VERSION, row.integer(kRoamPdpProtocol)));
-    profile.static_ip_flag.assign(choice(row.integer(kIsStaticIpAddr) == 1, "on", "off"));
-    profile.static_dns_flag.assign(choice(row.integer(kIsStaticDnsAddr) == 1, "on", "off"));
-    profile.hidden_status.assign(choice(row.integer(kHidden) == 1, "hidden", "show"));
-    profile.editable.assign(choice(row.integer(kEditable) == 1, "yes", "no"));
-    profile.roaming_enable_status.assign(choice(row.integer(kIsRoamingApn) == 1, "enable", "disable"));
-    profile.enable_status.assign(choice(row.integer(kProfileEnable) != 0, "enable", "disable"));
+    profile.static_ip_flag.assign(
+        switch_word(ZEL_SVC_ELEMENT_STATIC_IP_ENABLE_FLAG, row.integer(kIsStaticIpAddr) == 1));
+    profile.static_dns_flag.assign(switch_word(ZEL_SVC_ELEMENT_DNS_ENABLE_FLAG, row.integer(kIsStaticDnsAddr) == 1));
+    profile.hidden_status.assign(switch_word(ZEL_SVC_ELEMENT_PROFILE_HIDDEN_STATUS, row.integer(kHidden) == 1));
+    profile.editable.assign(switch_word(ZEL_SVC_ELEMENT_PROFILE_EDITABLE, row.integer(kEditable) == 1));
+    profile.roaming_enable_status.assign(
+        switch_word(ZEL_SVC_ELEMENT_PROFILE_ROAMING_ENABLE_STATUS, row.integer(kIsRoamingApn) == 1));
+    profile.enable_status.assign(switch_word(ZEL_SVC_ELEMENT_PROFILE_ENABLE_STATUS, row.integer(kProfileEnable) != 0));
 }
 
 // A network that is gone leaves its name and MCC+MNC empty.

@@ -1,6 +1,7 @@
 #include "zel-svc-element-act-connection.h"
 
 #include "base/zel-svc-log.h"
+#include "base/zel-svc-number.h"
 #include "spec/zel-svc-parse-context.h"
 #include "zel-svc-element-act-connection-handle.h"
 #include "zel-svc-element-act-connection-profile.h"
@@ -9,7 +10,6 @@
 
 #include <algorithm>
 #include <array>
-#include <limits>
 
 namespace {
 
@@ -51,9 +51,7 @@ std::optional<std::int32_t> next_profile_id(NetworkDatabase &database) {
     case NetworkStep::Failed:
         return std::nullopt;
     }
-    const std::int32_t last = maximum.integer(0);
-    if (last == std::numeric_limits<std::int32_t>::max()) return std::nullopt;
-    return last + 1;
+    return zel_svc_network_id_after(maximum.integer(0));
 }
 
 // Whether no profile of the MCC+MNC is the service's default yet. Asked on a connection of its own; a database
@@ -72,14 +70,9 @@ bool becomes_default(std::optional<std::int32_t> category, const Profile &profil
     return gbZelSvcNetworkAutoFlags[ZEL_SVC_AUTO_PROFILE] == 1 || lacks_default(*category, profile);
 }
 
-int next_number() {
-    const int held = zel_svc_data_get_int(ZEL_SVC_DATA_CONNECTION, "connection", "count", 0);
-    return held < std::numeric_limits<int>::max() ? held + 1 : held;
-}
-
 // What finds the row again, once there is one.
 void record_row(int spec_index, std::int32_t profile_id, int number) {
-    const std::string key = "profile_id_" + std::to_string(spec_index);
+    const std::string key = "profile_id_" + zel_svc_number_text(spec_index);
     zel_svc_data_set_int(ZEL_SVC_DATA_CONNECTION, "spec", key.c_str(), profile_id);
     zel_svc_data_set_int(ZEL_SVC_DATA_CONNECTION, "connection", "count", number);
     zel_svc_data_set_int(ZEL_SVC_DATA_CONNECTION, "spec", "count", spec_index);
@@ -118,7 +111,7 @@ void __zel_svc_element_act_connection_set_profile(int spec_index, Profile &profi
                                .category = category.value_or(ZEL_SVC_CATEGORY_INTERNET),
                                .is_default = becomes_default(category, profile) ? 1 : 0,
                                .proxy = zel_svc_profile_row_proxy(profile)};
-    const int number = next_number();
+    const int number = zel_svc_record_next_number(ZEL_SVC_DATA_CONNECTION, "connection");
     if (const auto refused = zel_svc_profile_row_bind(insert, row, number)) {
         if (refused->column == ZEL_SVC_PROFILE_ENABLE_COLUMN)
             ZEL_SVC_LOG("<Warning>[Connection][DB] sqlite3_bind_int(%d(profile_enable),%d)=%d(Not SQLITE_OK) failed.\n",

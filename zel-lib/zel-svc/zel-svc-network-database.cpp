@@ -1,16 +1,20 @@
 #include "zel-svc-network-database.h"
 
-#include "base/zel-svc-number.h"
+#include "base/zel-svc-decimal.h"
 #include "spec/zel-svc-parse-context.h"
 
 #include <db-util.h>
+#include <limits>
 
 namespace {
 
 sqlite3 *open_current() {
     if (ZEL_SVC_NETWORK_DB_PATH[0] == '\0') return nullptr;
     sqlite3 *database = nullptr;
-    return db_util_open(ZEL_SVC_NETWORK_DB_PATH, &database, 0) == SQLITE_OK ? database : nullptr;
+    if (db_util_open(ZEL_SVC_NETWORK_DB_PATH, &database, 0) == SQLITE_OK) return database;
+    // SQLite's own opener leaves a handle behind a failure, and so may one built on it.
+    if (database) db_util_close(database);
+    return nullptr;
 }
 
 } // namespace
@@ -49,12 +53,23 @@ NetworkStep NetworkStatement::step() {
     }
 }
 
-// Read as a text: the integer reading would cut a number of 64 bits to some other one.
-std::int32_t NetworkStatement::integer(int column) const { return zel_svc_number_from_text(text(column)); }
+// Read as a text: the integer reading would cut a number of 64 bits to some other one. A column may hold a
+// fraction or a large number with an exponent.
+std::int32_t NetworkStatement::integer(int column) const {
+    const std::string_view number = text(column);
+    if (number == "Inf") return std::numeric_limits<std::int32_t>::max();
+    if (number == "-Inf") return std::numeric_limits<std::int32_t>::min();
+    return zel_svc_whole_from_text(number);
+}
 
 std::string_view NetworkStatement::text(int column) const {
     const unsigned char *bytes = sqlite3_column_text(statement_.get(), column);
     return bytes ? std::string_view{reinterpret_cast<const char *>(bytes)} : std::string_view{};
+}
+
+std::optional<std::int32_t> zel_svc_network_id_after(std::int32_t last) {
+    if (last == std::numeric_limits<std::int32_t>::max()) return std::nullopt;
+    return last + 1;
 }
 
 NetworkDatabase::NetworkDatabase() : database_(open_current()) {}

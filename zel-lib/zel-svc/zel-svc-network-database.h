@@ -16,6 +16,7 @@
 #include <cstddef>
 #include <cstdint>
 #include <memory>
+#include <optional>
 #include <string_view>
 
 struct sqlite3;
@@ -45,7 +46,8 @@ class NetworkStatement {
     // Steps a statement without rows; whether it ran to completion.
     bool run() { return step() == NetworkStep::Done; }
 
-    // Columns of the row, from 0. A null is 0 or empty; what lies outside 32 bits saturates.
+    // Columns of the row, from 0. A null is 0 or empty; a fraction is cut, what lies outside 32 bits
+    // saturates, and a word is 0.
     [[nodiscard]] std::int32_t integer(int column) const;
     [[nodiscard]] std::string_view text(int column) const; // until the next step
 
@@ -81,3 +83,6 @@ class NetworkDatabase {
     };
     std::unique_ptr<sqlite3, Close> database_;
 };
+
+// The id of a row behind the largest one of its table; nothing behind the largest integer there is.
+std::optional<std::int32_t> zel_svc_network_id_after(std::int32_t last);

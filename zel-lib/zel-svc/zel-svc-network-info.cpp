@@ -2,7 +2,6 @@
 
 #include "zel-svc-network-database.h"
 
-#include <limits>
 #include <optional>
 
 namespace {
@@ -54,9 +53,9 @@ std::optional<std::int32_t> create(NetworkDatabase &database, std::int32_t unuse
         return std::nullopt;
     }
     const auto last = first_id(std::move(maximum));
-    if (!last || *last == std::numeric_limits<std::int32_t>::max()) return std::nullopt;
-    if (!insert(database, *last + 1, name, mccmnc)) return std::nullopt;
-    return *last + 1;
+    const auto id = last ? zel_svc_network_id_after(*last) : std::nullopt;
+    if (!id || !insert(database, *id, name, mccmnc)) return std::nullopt;
+    return id;
 }
 
 std::optional<std::int32_t> find_or_create(NetworkDatabase &database, const char *name, const char *mccmnc) {

@@ -2,8 +2,6 @@
 
 #include "zel-svc-network-info.h"
 
-#include <limits>
-
 std::optional<std::int32_t> zel_svc_current_operators_network_id() {
     const ZelSvcSimOperator &current = zel_svc_current_operator();
     std::int32_t id = 0;
@@ -15,7 +13,5 @@ std::optional<std::int32_t> zel_svc_network_next_id(NetworkDatabase &database, c
     NetworkStatement statement = database.prepare(select);
     if (statement.step() != NetworkStep::Row) return std::nullopt;
     if (statement.integer(0) == 0) return first;
-    const std::int32_t maximum = statement.integer(1);
-    if (maximum == std::numeric_limits<std::int32_t>::max()) return std::nullopt;
-    return maximum + 1;
+    return zel_svc_network_id_after(statement.integer(1));
 }

@@ -65,9 +65,8 @@ std::int64_t leading(const std::string &digits, std::int64_t count) {
     return value;
 }
 
-} // namespace
-
-std::int32_t zel_svc_thousandths_from_text(std::string_view text) {
+// The number with its point moved `places` to the right, cut to an integer.
+std::int32_t shifted(std::string_view text, std::int64_t places) {
     using Limits = std::numeric_limits<std::int32_t>;
     Cursor cursor{text};
     cursor.skip_blanks();
@@ -76,9 +75,14 @@ std::int32_t zel_svc_thousandths_from_text(std::string_view text) {
     const auto before_point = static_cast<std::int64_t>(digits.size());
     if (cursor.take('.')) digits += cursor.take_digits();
     if (digits.empty()) return 0;
-    const std::int64_t value = leading(digits, before_point + exponent(cursor) + kThousandths);
+    const std::int64_t value = leading(digits, before_point + exponent(cursor) + places);
     return static_cast<std::int32_t>(std::clamp<std::int64_t>(negative ? -value : value, Limits::min(), Limits::max()));
 }
+
+} // namespace
+
+std::int32_t zel_svc_thousandths_from_text(std::string_view text) { return shifted(text, kThousandths); }
+std::int32_t zel_svc_whole_from_text(std::string_view text) { return shifted(text, 0); }
 
 std::string zel_svc_thousandths_text(std::int32_t thousandths) {
     constexpr int kDigits = 6;

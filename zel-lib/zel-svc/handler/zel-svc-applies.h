@@ -1,6 +1,6 @@
 #pragma once
 // When does an item of the spec apply? Questions that are asked by every group whose data may come from the
-// SIM card instead of the specification.
+// SIM card instead of the customer's file.
 
 #include "spec/zel-svc-occurrence.h"
 

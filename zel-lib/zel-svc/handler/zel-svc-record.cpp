@@ -75,9 +75,13 @@ void zel_svc_field_load(ZelSvcDataGroup group, const char *section, const FieldR
     text.assign(shown(rules, zel_svc_data_get_int(group, where, key.c_str(), kAbsent)));
 }
 
-int zel_svc_record_count_up(ZelSvcDataGroup group, const char *section) {
+int zel_svc_record_next_number(ZelSvcDataGroup group, const char *section) {
     const int held = zel_svc_data_get_int(group, section, "count", 0);
-    const int number = held < std::numeric_limits<int>::max() ? held + 1 : held;
+    return held < std::numeric_limits<int>::max() ? held + 1 : held;
+}
+
+int zel_svc_record_count_up(ZelSvcDataGroup group, const char *section) {
+    const int number = zel_svc_record_next_number(group, section);
     zel_svc_data_set_int(group, section, "count", number);
     return number;
 }

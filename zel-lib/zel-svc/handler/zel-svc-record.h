@@ -193,8 +193,11 @@ void zel_svc_record_load(ZelSvcDataGroup group, const char *section, std::span<c
         zel_svc_field_load(group, section, field.rules, number, field.of(record));
 }
 
-// Raises the section's "count" by one and returns it: the number of the item to be written. The largest number
-// stays.
+// The number of the item to be written: one above the section's "count". Behind the largest number comes the
+// same again.
+int zel_svc_record_next_number(ZelSvcDataGroup group, const char *section);
+
+// Sets the section's "count" to that number and returns it.
 int zel_svc_record_count_up(ZelSvcDataGroup group, const char *section);
 
 // Adds the line "[item/label] Spec='...',Phone='...'" of one field, when its rules want one; an empty item

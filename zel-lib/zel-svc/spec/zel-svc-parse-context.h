@@ -29,7 +29,7 @@ enum ZelSvcParseMode : std::uint32_t {
 extern ZelSvcParseAction geZelSvcParseAction;
 extern ZelSvcParseMode geZelSvcParseMode;
 
-// Which groups of operator data come from the inserted SIM instead of the specification.
+// Which groups of operator data come from the inserted SIM instead of the customer's file.
 enum ZelSvcAutoFlag : std::int32_t {
     ZEL_SVC_AUTO_PROFILE,
     ZEL_SVC_AUTO_VOICEMAIL,
