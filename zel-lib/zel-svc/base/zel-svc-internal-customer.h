@@ -1,8 +1,8 @@
 #pragma once
 // Sales codes that share one customer folder.
 
-#include "zel-svc-active-customer.h"
-#include "zel-svc-text.h"
+#include "base/zel-svc-active-customer.h"
+#include "base/zel-svc-text.h"
 
 #include <string_view>
 
