@@ -1,5 +1,6 @@
 #include "service-phone.h"
 
+#include <algorithm>
 #include <cstring>
 
 namespace {
@@ -14,6 +15,10 @@ ZelSvcSimOperator some_operator() {
     std::strcpy(entry.sp_name, "Vodacom SA");
     return entry;
 }
+
+constexpr const char *kKeys[] = {"db/private/zel/sim_auto_op_customer_name", "db/private/zel/sim_auto_op_network_name",
+                                 "db/private/zel/sim_auto_op_mcc_mnc",       "db/private/zel/sim_auto_op_subset_code",
+                                 "db/private/zel/sim_auto_op_sp_code",       "db/private/zel/sim_auto_op_sp_name"};
 
 class ActiveOperator : public zel_test::ServicePhone {
   protected:
@@ -80,20 +85,36 @@ TEST_F(ActiveOperator, TheServiceProvidersNameIsReadUpTo14Bytes) {
     EXPECT_STREQ(read_.sp_name, "12345678901234");
 }
 
-TEST_F(ActiveOperator, ALongStoredTextIsCutToItsField) {
-    set_string("db/private/zel/sim_auto_op_mcc_mnc", "123456789012");
-    zel_svc_sim_auto_setting_get_active_operator(&read_, 1);
-    EXPECT_STREQ(read_.mccmnc, "123456789");
+TEST_F(ActiveOperator, LongStoredTextsAreCutToTheirFields) {
+    const std::string text(50, 'x');
+    for (const char *key : kKeys)
+        set_string(key, text);
+    EXPECT_EQ(zel_svc_sim_auto_setting_get_active_operator(&read_, 1), 1);
+    EXPECT_EQ(read_.customer_name, std::string(9, 'x'));
+    EXPECT_EQ(read_.network_name, std::string(39, 'x'));
+    EXPECT_EQ(read_.mccmnc, std::string(9, 'x'));
+    EXPECT_EQ(read_.subset_code, std::string(9, 'x'));
+    EXPECT_EQ(read_.gid, std::string(9, 'x'));
+    EXPECT_EQ(read_.sp_name, std::string(14, 'x'));
 }
 
-TEST_F(ActiveOperator, AMissingKeyMakesTheResult0AndFillsTheRest) {
-    zel_svc_sim_auto_setting_set_active_operator(&entry_, 1);
-    call("vconf-unset", {{"key", "db/private/zel/sim_auto_op_mcc_mnc"}});
-    std::memset(&read_, 'x', sizeof read_);
-    EXPECT_EQ(zel_svc_sim_auto_setting_get_active_operator(&read_, 1), 0);
-    EXPECT_STREQ(read_.network_name, "Vodacom");
-    EXPECT_STREQ(read_.mccmnc, "");
-    EXPECT_STREQ(read_.sp_name, "Vodacom SA");
+TEST_F(ActiveOperator, EachMissingKeyMakesTheResult0AndFillsTheRest) {
+    const auto empty_fields = [&] {
+        int count = 0;
+        for (const char *field :
+             {read_.customer_name, read_.network_name, read_.mccmnc, read_.subset_code, read_.gid, read_.sp_name})
+            count += field[0] == '\0' ? 1 : 0;
+        return count;
+    };
+    for (const char *key : kKeys) {
+        zel_svc_sim_auto_setting_set_active_operator(&entry_, 1);
+        call("vconf-unset", {{"key", key}});
+        std::memset(&read_, 'x', sizeof read_);
+        EXPECT_EQ(zel_svc_sim_auto_setting_get_active_operator(&read_, 1), 0) << key;
+        EXPECT_EQ(empty_fields(), 1) << key;
+    }
+    EXPECT_STREQ(read_.sp_name, ""); // the last one that was missing
+    EXPECT_STREQ(read_.gid, "FF");
 }
 
 TEST_F(ActiveOperator, WithoutARecordItTellsWhetherAllKeysExist) {
@@ -164,6 +185,8 @@ INSTANTIATE_TEST_SUITE_P(
     ::testing::Values(
         RefusedWrite{1, "db/private/zel/sim_auto_op_customer_name",
                      "vconf_set_str(ZelSimAutoOpCustomerName,'XFV')=-7 failed."},
+        RefusedWrite{2, "db/private/zel/sim_auto_op_customer_name",
+                     "vconf_set_str(ZelSimAutoOpCustomerName,'XFV')=-7 failed."},
         RefusedWrite{1, "db/private/zel/sim_auto_op_network_name",
                      "vconf_set_str(ZelSimAutoOpNetName,'Vodacom')=-7 failed."},
         RefusedWrite{1, "db/private/zel/sim_auto_op_mcc_mnc", "vconf_set_str(ZelSimOpMccMnc)=-7 failed."},
@@ -229,6 +252,9 @@ TEST_P(ClearActiveOperatorRefused, MakesTheResult0AndClearsTheRest) {
     EXPECT_EQ(zel_svc_sim_auto_setting_clear_active_operator(), 0);
     EXPECT_TRUE(!GetParam().message || system_logged(GetParam().message));
     EXPECT_TRUE(system_logged("Clearing active operator(vconf) failed."));
+    const auto failures = [](const std::string &line) { return line.find("=-3 failed.") != std::string::npos; };
+    const std::vector<std::string> log = system_log();
+    EXPECT_EQ(std::count_if(log.begin(), log.end(), failures), GetParam().message ? 1 : 0);
     expect_cleared_but(GetParam().key);
 }
 
