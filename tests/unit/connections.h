@@ -54,7 +54,7 @@ struct ReadFault {
 };
 inline constexpr ReadFault kReadFaults[] = {
     {"db_util_open", ZEL_SVC_NETWORK_DB_PATH_SIM1, 1},       // the profile's and its network's connection
-    {"sqlite3_prepare_v2", ZEL_SVC_NETWORK_DB_PATH_SIM1, 1}, // the profile
+    {"sqlite3_prepare_v2", ZEL_SVC_NETWORK_DB_PATH_SIM1, 1}, // each of its statements
     {"sqlite3_step", "select * from pdp_profile", 1},
     {"sqlite3_step", "select network_name, mccmnc", 1},
 };

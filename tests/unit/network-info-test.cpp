@@ -241,6 +241,10 @@ TEST_F(NetworkInfo, MaximumThatCannotBePreparedFailsButLeavesARow) {
         "collate none_such, network_name text, mccmnc text)' where name='network_info'");
     EXPECT_EQ(get_id("One", "26201", kCreate), kFailed);
     EXPECT_EQ(SqliteFile{file()}.rows("select * from network_info"), (SqliteRows{{"0", "One", "26201"}}));
+    run("update network_info set network_info_id=-3");
+    EXPECT_EQ(get_id("One", "26201", kCreate), kFailed);
+    EXPECT_EQ(SqliteFile{file()}.rows("select * from network_info"),
+              (SqliteRows{{"-3", "One", "26201"}, {"-3", "One", "26201"}}));
 }
 
 TEST_F(NetworkInfo, NoIdFollowsTheLargestInteger) {
