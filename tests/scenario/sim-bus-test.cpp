@@ -9,6 +9,7 @@
 #include <cstring>
 #include <dbus/dbus.h>
 #include <gmock/gmock.h>
+#include <memory>
 
 namespace {
 
@@ -196,6 +197,39 @@ TEST_F(SimBus, ABusThatWentAwayIsNoObstacleToTheNextInstall) {
     install();
     EXPECT_EQ(get_int(kUpdated), 1);
     EXPECT_THAT(end_of_call(), StartsWith("[SIM1] ==> failed(err.name='org.freedesktop.DBus.Error."));
+}
+
+// The process keeps its one connection, which ended with the bus, until somebody who listens to it is told so.
+TEST_F(SimBus, ABusThatComesBackIsFoundOnceTheProcessHasHeardOfItsEnd) {
+    auto bus = std::make_unique<PhoneBus>(root());
+    bus->start_telephony(Telephony::Answers);
+    install();
+    EXPECT_EQ(end_of_call(), "[SIM1] ==> succeeded.");
+    bus.reset();
+    bus = std::make_unique<PhoneBus>(root());
+    bus->start_telephony(Telephony::Answers);
+    for (int attempt = 0; attempt < 2; ++attempt) {
+        install();
+        EXPECT_THAT(end_of_call(), StartsWith("[SIM1] ==> failed(err.name='org.freedesktop.DBus.Error.Disconnected',"));
+    }
+    EXPECT_THAT(bus->calls(), IsEmpty());
+    DBusConnection *ended = dbus_bus_get(DBUS_BUS_SYSTEM, nullptr);
+    ASSERT_NE(ended, nullptr);
+    while (dbus_connection_dispatch(ended) == DBUS_DISPATCH_DATA_REMAINS) {
+    }
+    dbus_connection_unref(ended);
+    install();
+    EXPECT_THAT(bus->calls(), ElementsAre("/modem1 com.tcore.ps.modem ResetProfile(int32 1)"));
+}
+
+TEST_F(SimBus, AModemThatTheListLacksIsTheRootPath) {
+    set_int("memory/telephony/sim_slot_count", 2);
+    PhoneBus bus(root());
+    bus.start_telephony(Telephony::Answers);
+    install(2);
+    EXPECT_THAT(bus_messages(), Contains("[SIM2] dbus_message_new_method_call(path='/',interface='com.tcore.ps.modem') "
+                                         "succeeded."));
+    EXPECT_THAT(bus.calls(), ElementsAre("/ com.tcore.ps.modem ResetProfile(int32 1)"));
 }
 
 // A process that listens to its shared connection is ended by the bus library when the bus goes away, unless it

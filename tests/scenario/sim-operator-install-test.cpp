@@ -176,6 +176,16 @@ class OperatorInstall : public zel_test::TwoSimPhone {
     ZelSvcSimOperator operator_ = {};
 };
 
+// Where the first and the last call with a text stand; it must be there.
+std::pair<std::ptrdiff_t, std::ptrdiff_t> calls_that_name(const std::string &text,
+                                                          const std::vector<std::string> &calls) {
+    const auto names = [&](const std::string &call) { return call.ends_with(text); };
+    const auto first = std::find_if(calls.begin(), calls.end(), names);
+    const auto last = std::find_if(calls.rbegin(), calls.rend(), names);
+    EXPECT_NE(first, calls.end()) << text;
+    return {first - calls.begin(), calls.rend() - last - 1};
+}
+
 std::vector<std::string> sorted(std::vector<std::string> texts) {
     std::sort(texts.begin(), texts.end());
     return texts;
@@ -454,19 +464,26 @@ TEST_F(OperatorInstall, ResetsRightBehindTheProfiles) {
     call("journal-start");
     install();
     const std::vector<std::string> calls = journal();
-    const auto first = [&](const std::string &text) {
-        return std::find_if(calls.begin(), calls.end(),
-                            [&](const std::string &line) { return line.find(text) != std::string::npos; });
-    };
-    const auto last = [&](const std::string &text) {
-        return std::find_if(calls.rbegin(), calls.rend(),
-                            [&](const std::string &line) { return line.find(text) != std::string::npos; })
-            .base();
-    };
-    const auto reset = first("tel_get_cp_name_list");
-    ASSERT_NE(reset, calls.end());
-    EXPECT_LE(last(data_path("connection")) - calls.begin(), reset - calls.begin());
-    EXPECT_LT(reset - calls.begin(), first(data_path("bookmark")) - calls.begin());
+    const auto [reset, answered] = calls_that_name("tel_get_cp_name_list", calls);
+    EXPECT_EQ(reset, answered);
+    EXPECT_LT(calls_that_name(data_path("connection"), calls).second, reset);
+    EXPECT_LT(reset, calls_that_name(data_path("bookmark"), calls).first);
+}
+
+TEST_F(OperatorInstall, GroupsAreInstalledOneBehindTheOtherThenTheUpdateIsTold) {
+    write_networks("TST", "TST", {}, network(all_flags()) + items_of_both());
+    call("journal-start");
+    install(2);
+    const std::vector<std::string> calls = journal();
+    std::ptrdiff_t before = -1;
+    for (const std::string &text :
+         {data_path("connection-2"), data_path("bookmark"), data_path("voice-mail-2"), data_path("email-account"),
+          data_path("wb-amr"), data_path("fast-dormancy-2"), data_path("max-pdp-2"), data_path("ims-2"),
+          std::string{kUpdated}, std::string{kSettingLog2}}) {
+        const auto [first, last] = calls_that_name(text, calls);
+        EXPECT_LT(before, first) << text;
+        before = last;
+    }
 }
 
 TEST_F(OperatorInstall, FieldsWithoutATerminatorAreReadToTheirEnd) {

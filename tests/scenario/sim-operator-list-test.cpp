@@ -121,6 +121,22 @@ TEST_F(OperatorList, OfAllCustomersGathersTheFilesInTheListsOrder) {
     EXPECT_THAT(list(-1), ElementsAre("BBX/B1/26202///", "BBX/B2/26203///", "AAA/A1/26201///"));
 }
 
+TEST_F(OperatorList, AFileWithoutGeneralInfoHasNoSalesCodeOfTheFileBefore) {
+    write_package({"/Customer/BBB/customer.xml", "/Customer/AAA/customer.xml"});
+    write_networks("BBB", "BBX", {{"B1", "26202"}});
+    write_customer("AAA", element("NetworkInfo", element("NetworkName", "A1")));
+    EXPECT_THAT(list(1), ElementsAre("BBX/B1/26202///", "AAA/A1////"));
+    set_string("db/zel/salescode", "AAA");
+    EXPECT_THAT(list(0), ElementsAre("AAA/A1////"));
+}
+
+TEST_F(OperatorList, OfAllCustomersHasNothingOfEntriesThatNobodyDescribed) {
+    write_header(element("CustomerDataSet",
+                         element("NbCustomer", "120") + "<CustomerData src=\"/Customer/AAA/customer.xml\"/>\n"));
+    write_networks("AAA", "AAA", {{"A1", "26201"}});
+    EXPECT_THAT(list(1), ElementsAre("AAA/A1/26201///"));
+}
+
 TEST_F(OperatorList, OfAllCustomersNeedsNoActiveCustomer) {
     set_string("db/zel/salescode", "");
     write_package({"/Customer/AAA/customer.xml"});
@@ -145,11 +161,17 @@ TEST_F(OperatorList, OfAllCustomersIsEmptyWithoutCustomers) {
 }
 
 TEST_F(OperatorList, WritesNothingToThePhone) {
-    write_networks("TST", "TST", {{"One", "26201"}});
+    // Before GeneralInfo ends, so that only what is read keeps them from being applied.
+    const std::string settings =
+        element("Settings", element("Main", element("Display", element("FontSize", "small")) +
+                                                element("Network", element("AutoVoicemail", "on")) +
+                                                element("WbAmr", element("WbAmrCodec", "on"))));
+    write_customer("TST", settings + element("GeneralInfo", element("SalesCode", "TST") + element("CountryISO", "DE") +
+                                                                element("NetworkInfo", element("NetworkName", "One"))));
     write_package({"/Customer/TST/customer.xml"});
     call("journal-start");
-    list(0);
-    list(1);
+    EXPECT_EQ(list(0).size(), 1U);
+    EXPECT_EQ(list(1).size(), 1U);
     for (const std::string &line : journal()) {
         EXPECT_THAT(line, Not(HasSubstr("vconf_set")));
         EXPECT_THAT(line, Not(HasSubstr("db_util_open")));

@@ -1,5 +1,6 @@
 // What the matcher says of every entry, which the command shows; what it chooses, which the library installs.
 
+#include "spec/zel-svc-element-stack.h"
 #include "support/bench-phone.h"
 #include "zel-svc-sim-auto-setting-match.h"
 #include "zel-svc-sim-auto-setting-operators.h"
@@ -53,6 +54,13 @@ TEST(SimVerdict, IsDecisiveByTheFirstThingAskedFor) {
     EXPECT_EQ(verdict(entry("21401", "", "", "YO"), sim("21401", "", "", "yo")), Verdict::Decisive);
 }
 
+TEST(SimVerdict, AnEntryAsksForTheFirstOfSubsetCodeGidAndSpName) {
+    EXPECT_EQ(zel_svc_sim_asks(entry("21401", "98", "A3", "Yo")), ZelSvcSimAsks::Msin);
+    EXPECT_EQ(zel_svc_sim_asks(entry("21401", "", "A3", "Yo")), ZelSvcSimAsks::Gid);
+    EXPECT_EQ(zel_svc_sim_asks(entry("21401", "", "", "Yo")), ZelSvcSimAsks::SpName);
+    EXPECT_EQ(zel_svc_sim_asks(entry("21401")), ZelSvcSimAsks::Nothing);
+}
+
 TEST(SimVerdict, OfASimWithoutNetworkIsAlwaysAnotherNetwork) {
     EXPECT_EQ(verdict(entry(""), sim("")), Verdict::OtherNetwork);
 }
@@ -92,6 +100,15 @@ TEST_F(SimOperatorsOf, ACustomerNeedsNotBeActive) {
     set_string("db/zel/salescode", "AAA");
     EXPECT_THAT(names("AAA"), ElementsAre("AAA One"));
     EXPECT_THAT(names("TFG"), ElementsAre("TFG Two"));
+}
+
+TEST_F(SimOperatorsOf, OnlyWhatANetworkSaysAboutItselfIsRead) {
+    write_customer("AAA", "One");
+    names("AAA");
+    std::vector<int> enabled;
+    for (int id = 0; id < ZEL_SVC_ELEMENT_COUNT; ++id)
+        if (zel_svc_element_is_enabled(static_cast<ZelSvcElementId>(id)) == 1) enabled.push_back(id);
+    EXPECT_THAT(enabled, ElementsAre(10, 11, 13, 14, 15, 16, 17, 18));
 }
 
 TEST_F(SimOperatorsOf, ACodeThatNamesNoFolderHasNone) {
