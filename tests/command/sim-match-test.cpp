@@ -140,6 +140,15 @@ TEST_F(ZelSimMatch, SaysWhenThereAreMoreEntriesThanAreRead) {
     }
 }
 
+TEST_F(ZelSimMatch, CustomersThatAreCountedButNotDescribedHaveNoOperators) {
+    write_header(4);
+    const Outcome outcome = run_zel({"sim", "operators", "--all", "--json"});
+    EXPECT_EQ(outcome.code, 0);
+    EXPECT_EQ(json::parse(outcome.out).size(), 7U);
+    EXPECT_EQ(outcome.err, "zel: sim operators: /opt/system/zel/mps/ZEL/SW_Configuration.xml counts more customers "
+                           "than it describes\n");
+}
+
 TEST_F(ZelSimMatch, NeedsACustomerWithAReadableFile) {
     EXPECT_THAT(run_zel({"sim", "matrix", "CCC"}).err, HasSubstr("/Customer/CCC/customer.xml"));
     EXPECT_EQ(run_zel({"sim", "match", "--mccmnc", "21401", "--customer", "CCC"}).code, 1);

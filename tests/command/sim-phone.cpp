@@ -17,15 +17,19 @@ void SimCommand::write_networks(const std::string &customer, const std::string &
           kStart + one("CustomerData", info + one("Settings", one("Main", settings))) + "\n");
 }
 
+void SimCommand::write_header(int customers) {
+    const std::string count = one("NbCustomer", std::to_string(customers));
+    write(std::string{kPackage} + "SW_Configuration.xml",
+          kStart + one("SW-Configuration",
+                       one("CustomerDataSet", count + "<CustomerData src=\"/Customer/AAA/customer.xml\"/>"
+                                                      "<CustomerData src=\"/Customer/BBB/customer.xml\"/>")));
+}
+
 // Customer AAA, active, has two operators in one network that a SIM tells apart, two that the user is asked
 // about, and one that comes too late; BBB is another customer of the package.
 void SimCommand::SetUp() {
     ZelCommand::SetUp();
-    write(std::string{kPackage} + "SW_Configuration.xml",
-          kStart +
-              one("SW-Configuration", one("CustomerDataSet", "<NbCustomer>2</NbCustomer>"
-                                                             "<CustomerData src=\"/Customer/AAA/customer.xml\"/>"
-                                                             "<CustomerData src=\"/Customer/BBB/customer.xml\"/>")));
+    write_header(2);
     write_networks("AAA",
                    network("Home", "21405") + network("Young", "21405", one("SPCode", "98")) +
                        network("Late", "21405", one("SPCode", "987")) + network("North", "21401") +

@@ -8,6 +8,8 @@ namespace zel_test {
 struct SimCommand : ZelCommand {
     void SetUp() override;
 
+    // The package's list of AAA and BBB, which promises so many customers.
+    void write_header(int customers);
     void write_networks(const std::string &customer, const std::string &networks, const std::string &settings = "");
     // One NetworkInfo; `more` is SPCode, SubsetCode or SPName.
     static std::string network(const std::string &name, const std::string &mccmnc, const std::string &more = "");

@@ -136,6 +136,12 @@ class NetworkDatabaseFaults : public zel_test::ServicePhone {
     void expect_profiles_recorded(const std::optional<std::string> &count) {
         EXPECT_EQ(recorded("connection", "count"), count);
     }
+    void expect_every_row() {
+        EXPECT_EQ(rows("network_info"), kNetworks);
+        EXPECT_EQ(rows("fast_dormancy"), kDormancy);
+        EXPECT_EQ(rows("max_pdp"), kLimits);
+        EXPECT_EQ(rows(kProfileColumns), kProfiles);
+    }
     // What an install of no known network records.
     void expect_items_of_no_network() {
         expect_dormancy_recorded("2");
@@ -146,10 +152,7 @@ class NetworkDatabaseFaults : public zel_test::ServicePhone {
 
 TEST_F(NetworkDatabaseFaults, NoneOfThem) {
     install();
-    EXPECT_EQ(rows("network_info"), kNetworks);
-    EXPECT_EQ(rows("fast_dormancy"), kDormancy);
-    EXPECT_EQ(rows("max_pdp"), kLimits);
-    EXPECT_EQ(rows(kProfileColumns), kProfiles);
+    expect_every_row();
     expect_dormancy_recorded("2");
     expect_limits_recorded("2", "3");
     expect_profiles_recorded("3");
@@ -246,10 +249,7 @@ TEST_F(NetworkDatabaseFaults, LockForWritingKeepsEveryRowAsItWas) {
         other.wait_until_locked();
         install();
     }
-    EXPECT_EQ(rows("network_info"), kNetworks);
-    EXPECT_EQ(rows("fast_dormancy"), kDormancy);
-    EXPECT_EQ(rows("max_pdp"), kLimits);
-    EXPECT_EQ(rows(kProfileColumns), kProfiles);
+    expect_every_row();
     expect_every_open_is_closed();
 }
 
@@ -384,10 +384,7 @@ TEST_F(NetworkDatabaseFaults, FullDiskTakesNoNewRow) {
 TEST_F(NetworkDatabaseFaults, CloseThatFailsChangesNothing) {
     fail("db_util_close");
     install();
-    EXPECT_EQ(rows("network_info"), kNetworks);
-    EXPECT_EQ(rows("fast_dormancy"), kDormancy);
-    EXPECT_EQ(rows("max_pdp"), kLimits);
-    EXPECT_EQ(rows(kProfileColumns), kProfiles);
+    expect_every_row();
     expect_every_open_is_closed();
 }
 

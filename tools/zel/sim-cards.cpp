@@ -2,21 +2,13 @@
 
 #include "commands.h"
 #include "failure.h"
+#include "imsi.h"
 
 #include <base/zel-svc-text.h>
 #include <zel-svc-sim-auto-setting-log.h>
 
-#include <algorithm>
-
 namespace zel_command {
 namespace {
-
-constexpr std::size_t kMccDigits = 3;
-constexpr std::size_t kImsiDigits = 15;
-
-bool is_digits(std::string_view text) {
-    return std::all_of(text.begin(), text.end(), [](char byte) { return byte >= '0' && byte <= '9'; });
-}
 
 [[noreturn]] void refuse(const std::string &why) { throw Failure{kUsage, why, "See 'zel sim --help'."}; }
 
@@ -25,8 +17,7 @@ int slot_count(const Invocation &invocation) {
 }
 
 void check_digits(const std::string &mccmnc, const std::string &msin) {
-    if (!is_digits(mccmnc) || mccmnc.size() < kMccDigits + 2 || mccmnc.size() > kMccDigits + 3)
-        refuse("--mccmnc takes the SIM's MCC and MNC: five or six digits, such as 21405");
+    if (!is_mccmnc(mccmnc)) refuse("--mccmnc takes the SIM's MCC and MNC: five or six digits, such as 21405");
     if (!is_digits(msin) || mccmnc.size() + msin.size() > kImsiDigits)
         refuse("--msin takes digits, with those of --mccmnc at most 15");
 }
@@ -90,14 +81,6 @@ ZelSvcSimInfo described_card(const Invocation &invocation) {
     return card;
 }
 
-std::string card_text(const ZelSvcSimInfo &card, bool reveal) {
-    std::string text = field_text(card.mccmnc);
-    if (card.msin[0] != '\0') text += ", MSIN " + shown_msin(field_text(card.msin), reveal);
-    if (card.gid[0] != '\0') text += ", GID " + field_text(card.gid);
-    if (card.spn[0] != '\0') text += ", SPN " + field_text(card.spn);
-    return text;
-}
-
 Json card_json(const ZelSvcSimInfo &card, bool reveal) {
     Json result = Json::object();
     put_text(result, "mccmnc", field_text(card.mccmnc));
@@ -106,6 +89,18 @@ Json card_json(const ZelSvcSimInfo &card, bool reveal) {
     put_text(result, "spn", field_text(card.spn));
     return result;
 }
+
+std::string card_text(const Json &card) {
+    constexpr std::pair<const char *, const char *> kParts[] = {{"msin", "MSIN"}, {"gid", "GID"}, {"spn", "SPN"}};
+    std::string text = bytes_of(card, "mccmnc");
+    for (const auto &[name, label] : kParts) {
+        const std::string part = bytes_of(card, name);
+        if (!part.empty()) text += std::string{", "} + label + " " + part;
+    }
+    return text;
+}
+
+std::string card_text(const ZelSvcSimInfo &card, bool reveal) { return card_text(card_json(card, reveal)); }
 
 int sim_insert(Invocation &invocation) {
     const ZelSvcSimInfo card = described_card(invocation);

@@ -25,8 +25,9 @@ std::string shown_first_digits(std::string_view code, bool reveal);
 // A card that --mccmnc, --msin, --gid and --spn describe. Throws a Failure when it is none.
 ZelSvcSimInfo described_card(const Invocation &invocation);
 
+Json card_json(const ZelSvcSimInfo &card, bool reveal);
 // "21405, MSIN 987***, GID A3, SPN Orange"; what the card lacks is left out.
 std::string card_text(const ZelSvcSimInfo &card, bool reveal);
-Json card_json(const ZelSvcSimInfo &card, bool reveal);
+std::string card_text(const Json &card); // of card_json()
 
 } // namespace zel_command

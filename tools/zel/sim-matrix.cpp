@@ -1,6 +1,7 @@
 #include "sim-matrix.h"
 
 #include "field-text.h"
+#include "imsi.h"
 
 #include <base/zel-svc-text.h>
 #include <zel-svc-sim-auto-setting-match.h>
@@ -9,12 +10,6 @@
 
 namespace zel_command {
 namespace {
-
-constexpr std::size_t kImsiDigits = 15;
-
-bool is_digits(const std::string &text) {
-    return std::all_of(text.begin(), text.end(), [](char byte) { return byte >= '0' && byte <= '9'; });
-}
 
 using Asks = ZelSvcSimAsks;
 
@@ -61,8 +56,7 @@ class Matrix {
 std::string Matrix::why_no_sim(std::size_t number) const {
     const ZelSvcSimOperator &entry = entries_[number];
     const std::string mccmnc = field_text(entry.mccmnc);
-    if (!is_digits(mccmnc) || mccmnc.size() < 5 || mccmnc.size() > 6)
-        return "no SIM has the MCC+MNC '" + mccmnc + "': it is not five or six digits";
+    if (!is_mccmnc(mccmnc)) return "no SIM has the MCC+MNC '" + mccmnc + "': it is not five or six digits";
     const std::string subset = field_text(entry.subset_code);
     if (!is_digits(subset)) return "no MSIN begins with '" + subset + "': it is not digits";
     return {};

@@ -59,19 +59,10 @@ std::string or_none(const std::string &text) { return text.empty() ? "none" : te
 std::string card_line(const Json &slot) {
     if (!slot.at("card")) return "none";
     if (!slot.at("readable")) return "cannot be read";
-    const Json &sim = slot.at("sim");
-    std::string text = bytes_of(sim, "mccmnc");
-    if (!bytes_of(sim, "msin").empty()) text += ", MSIN " + bytes_of(sim, "msin");
-    if (!bytes_of(sim, "gid").empty()) text += ", GID " + bytes_of(sim, "gid");
-    if (!bytes_of(sim, "spn").empty()) text += ", SPN " + bytes_of(sim, "spn");
-    return text;
+    return card_text(slot.at("sim"));
 }
 
-std::string known_line(const Json &slot) {
-    const Json &known = slot.at("seen_last_time");
-    const std::string msin = bytes_of(known, "msin");
-    return or_none(bytes_of(known, "mccmnc") + (msin.empty() ? "" : ", MSIN " + msin));
-}
+std::string known_line(const Json &slot) { return or_none(card_text(slot.at("seen_last_time"))); }
 
 ZelSvcSimOperator active_operator(int slot) {
     ZelSvcSimOperator entry{};
