@@ -85,6 +85,8 @@ struct HostilePackage : zel_test::BenchPhone {
         zel_svc_config_upgrade_pre_config_for_fota_mode("TST");
         zel_svc_config_upgrade_pre_config_for_normal_booting();
         zel_svc_config_set_pre_config_for_factory_reset();
+        zel_svc_config_verification_for_imei(nullptr, 0);
+        zel_svc_config_encoding_xml();
     }
 
     std::string outside;
@@ -116,6 +118,7 @@ TEST_F(HostilePackage, LinksInThePhoneAreNotWrittenThroughToTheOutside) {
     link("/csa/imei/prodcode.dat", outside + "/secret");
     link("/opt/dbspace/.dnet.db", outside + "/secret");
     link("/opt/system/zel-default/SW_Configuration.xml", outside + "/secret");
+    link("/opt/system/zel-default/app", outside + "/folder");
     const auto before = snapshot(outside);
     run_every_kind();
     EXPECT_EQ(snapshot(outside), before);
