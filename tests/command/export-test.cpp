@@ -53,7 +53,11 @@ TEST_F(ZelExport, WritesTheDocumentToAFile) {
     }
     const Outcome outcome = run_zel({"export", "-o", folder + "/missing/a.xml"});
     EXPECT_EQ(outcome.code, 1);
-    EXPECT_THAT(outcome.err, HasSubstr("cannot write the document to '" + folder + "/missing/a.xml'"));
+    EXPECT_THAT(outcome.err,
+                HasSubstr("cannot write the document to '" + folder + "/missing/a.xml': No such file or directory\n"));
+    EXPECT_EQ(run_zel({"export", "-o", "-"}).out, read(kDocument));
+    EXPECT_EQ(json_of({"export", "-o", folder + "/b.xml"}), (nlohmann::json{{"warnings", nlohmann::json::array()}}));
+    EXPECT_EQ(content_of(folder + "/b.xml"), read(kDocument));
     remove_folder(folder);
 }
 
@@ -72,6 +76,22 @@ TEST_F(ZelExport, InstallableHoldsThePackagesNetworksAsTheyStandThere) {
     expected.insert(expected.find(behind) + behind.size(), added);
     EXPECT_EQ(outcome.out, expected);
     EXPECT_EQ(read(kDocument), plain) << "the phone's own document has none";
+}
+
+// An element ends where the phone's reader ends it, whatever its end tag and its attributes say.
+TEST_F(ZelExport, InstallableTakesEachNetworkAsAWhole) {
+    const std::string networks[] = {
+        "<NetworkInfo><NetworkInfo><SPCode>1</SPCode></NetworkInfo><SPName>outer</SPName></NetworkInfo>",
+        "<NetworkInfo><SPName>odd end</SPName></Networkinfo>", "<NetworkInfo a=\"x>y\"/>",
+        "<NetworkInfo></NetworkInfo>"};
+    make_phone("<GeneralInfo>" + networks[0] + "<A/>" + networks[1] + "<SalesCode>XFV</SalesCode>" + networks[2] +
+               networks[3] + "</GeneralInfo>");
+    std::string added;
+    for (const std::string &network : networks)
+        added += "    " + network + "\n";
+    const Outcome outcome = run_zel({"export", "--installable"});
+    EXPECT_EQ(outcome.code, 0) << outcome.err;
+    EXPECT_THAT(outcome.out, HasSubstr("</CountryISO>\n" + added + "  </GeneralInfo>\n"));
 }
 
 TEST_F(ZelExport, InstallableOfAFileWithoutNetworksWarns) {
@@ -112,6 +132,23 @@ TEST_F(ZelExport, NamesEachValueThatNoOtherReaderUnderstands) {
                            "('?\?')\n");
     Outcome json = run_zel({"export", "--json"});
     EXPECT_EQ(nlohmann::json::parse(json.out)["warnings"].size(), 2U);
+}
+
+// A value may look like the document around it.
+TEST_F(ZelExport, IsNotDeceivedByTagsInAValue) {
+    make_phone("");
+    write("/opt/system/zel-default/data/zel-default-data-gps.ini", "[gps]\ngps_activation = 1\n");
+    for (const char *value :
+         {"a</CountryISO>\nb", "a</CountryISO>\n    <CountryISO>b", "a</CountryISO>\n<Anything>\n</Anything>\n",
+          "a</CountryISO>\n  </GeneralInfo>", "</CountryISO>\n", "a</CountryISO>\n  </GeneralInfo>\n  <Settings>\n"}) {
+        set_string("db/zel/country_iso", value);
+        const Outcome outcome = run_zel({"export"});
+        EXPECT_EQ(outcome.err, "zel: export: CustomerData/GeneralInfo/CountryISO: the value holds '<', which stands in "
+                               "the document as it is\n"
+                               "zel: export: CustomerData/Settings/GPS/GPSActivation: the phone's value could not be "
+                               "read ('?\?')\n")
+            << value;
+    }
 }
 
 TEST_F(ZelExport, SaysWhenTheDocumentCannotBeWritten) {

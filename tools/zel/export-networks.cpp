@@ -14,7 +14,9 @@ constexpr std::string_view kMark = "\xEF\xBB\xBF";
 struct Search {
     std::string_view text;
     const ZelSvcXmlParser *parser = nullptr;
-    std::size_t start = std::string_view::npos;
+    int depth = 0; // of the elements that are open
+    int level = 0; // the open NetworkInfo's depth, 0 without one
+    std::size_t start = 0;
     std::vector<std::string> found;
 };
 Search *gSearch = nullptr;
@@ -23,15 +25,27 @@ std::size_t place() { return static_cast<std::size_t>(gSearch->parser->item); }
 
 std::int32_t start_element(std::uint32_t /*user*/, const char *name, std::int32_t /*size*/,
                            const ZelSvcXmlAttribute * /*attributes*/) {
-    if (gSearch->start == std::string_view::npos && std::string_view{name} == "NetworkInfo") gSearch->start = place();
+    ++gSearch->depth;
+    if (gSearch->level != 0 || std::string_view{name} != "NetworkInfo") return 0;
+    gSearch->level = gSearch->depth;
+    gSearch->start = place();
     return 0;
 }
 
-std::int32_t end_element(std::uint32_t /*user*/, const char *name) {
-    if (gSearch->start == std::string_view::npos || std::string_view{name} != "NetworkInfo") return 0;
-    const std::size_t end = std::min(gSearch->text.find('>', place()), gSearch->text.size() - 1);
-    gSearch->found.emplace_back(gSearch->text.substr(gSearch->start, end + 1 - gSearch->start));
-    gSearch->start = std::string_view::npos;
+// An element without content ends in its start tag, whose attributes may hold a ">" as well.
+std::size_t end_of_tag(std::string_view text, std::size_t place) {
+    bool quoted = false;
+    while (place < text.size() && (quoted || text[place] != '>'))
+        quoted ^= text[place++] == '"';
+    return std::min(place + 1, text.size());
+}
+
+// What an end tag is called does not matter: the phone's reader does not look at it either.
+std::int32_t end_element(std::uint32_t /*user*/, const char * /*name*/) {
+    if (gSearch->depth-- != gSearch->level) return 0;
+    gSearch->level = 0;
+    gSearch->found.emplace_back(
+        gSearch->text.substr(gSearch->start, end_of_tag(gSearch->text, place()) - gSearch->start));
     return 0;
 }
 

@@ -4,12 +4,11 @@
 #include "commands.h"
 #include "export-document.h"
 #include "failure.h"
+#include "output-file.h"
 #include "output.h"
 #include "package-check.h"
 
 #include <zel-svc.h>
-
-#include <fstream>
 
 namespace zel_command {
 namespace {
@@ -48,11 +47,9 @@ std::string with_networks(const Invocation &invocation, const std::string &docum
     return document_with_networks(document, found.texts);
 }
 
-void print_document(const Invocation &invocation, const std::string &document,
-                    const std::vector<std::string> &warnings) {
-    if (!invocation.json) return print(document);
+void print_json_answer(const std::string *document, const std::vector<std::string> &warnings) {
     Json answer = Json::object();
-    put_text(answer, "document", document);
+    if (document != nullptr) put_text(answer, "document", *document);
     answer["warnings"] = Json::array();
     for (const std::string &warning : warnings)
         put_text(answer["warnings"].emplace_back(Json::object()), "warning", warning);
@@ -60,9 +57,9 @@ void print_document(const Invocation &invocation, const std::string &document,
 }
 
 void write_document(const std::string &path, const std::string &document) {
-    std::ofstream file{path, std::ios::binary};
-    file << document;
-    if (!file.flush()) throw Failure{kFailed, "export: cannot write the document to '" + path + "'"};
+    const std::string error = write_file(path, document);
+    if (error.empty()) return;
+    throw Failure{kFailed, "export: cannot write the document to '" + path + "': " + error};
 }
 
 } // namespace
@@ -71,10 +68,12 @@ int export_phone(Invocation &invocation) {
     std::string document = exported(invocation);
     const std::vector<std::string> warnings = document_warnings(document);
     if (invocation.has("installable")) document = with_networks(invocation, document);
-    if (invocation.has("output"))
-        write_document(invocation.value("output"), document);
-    else
-        print_document(invocation, document, warnings);
+    const bool to_file = invocation.names_file("output");
+    if (to_file) write_document(invocation.value("output"), document);
+    if (invocation.json)
+        print_json_answer(to_file ? nullptr : &document, warnings);
+    else if (!to_file)
+        print(document);
     for (const std::string &warning : warnings)
         report("export: " + escaped_line(warning));
     return kDone;

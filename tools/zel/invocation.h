@@ -28,6 +28,8 @@ class Invocation {
         const auto found = values.find(name);
         return found == values.end() ? std::string{} : found->second;
     }
+    // An option for a file was given, and it is not "-", standard output.
+    [[nodiscard]] bool names_file(const std::string &name) const { return has(name) && value(name) != "-"; }
 };
 
 } // namespace zel_command
