@@ -159,7 +159,54 @@ TEST_F(ZelVerify, OfAFileThatCannotBeReadToItsEndFails) {
     const Outcome outcome = run_zel({"verify"});
     EXPECT_EQ(outcome.code, 1);
     EXPECT_THAT(outcome.err, HasSubstr("Customer/XFV/customer.xml:1:"));
-    EXPECT_THAT(outcome.out, HasSubstr("Result "));
+    EXPECT_THAT(outcome.out,
+                HasSubstr("Result         INCOMPLETE: the phone has all 0 values that could be compared\n"));
+}
+
+// Nothing failed, but nobody may take that for a phone that is what its package says.
+TEST_F(ZelVerify, OfAFileThatCannotBeReadToItsEndIsNowhereOk) {
+    make_phone();
+    write_file("<GPS><GPSActivation>on</GPSActivation></GPS><A =1></A>");
+    const std::string folder = make_folder();
+    const Outcome outcome = run_zel({"verify", "--json", "--html", folder + "/page.html"});
+    EXPECT_EQ(outcome.code, 1);
+    const auto answer = nlohmann::json::parse(outcome.out);
+    EXPECT_EQ(answer["ok"], false);
+    EXPECT_EQ(answer["failed"]["spec"], 0);
+    ASSERT_EQ(answer["problems"].size(), 1U);
+    EXPECT_THAT(answer["problems"][0]["problem"].get<std::string>(), HasSubstr("customer.xml:1:"));
+    const std::string page = content_of(folder + "/page.html");
+    EXPECT_THAT(page, HasSubstr("<p class=\"verdict not-ok\">INCOMPLETE</p>\n<ul class=\"problems\">\n<li>"));
+    EXPECT_THAT(page, HasSubstr("customer.xml:1:"));
+    const Outcome imei = run_zel({"verify", "--imei"});
+    EXPECT_EQ(imei.code, 1);
+    EXPECT_EQ(imei.out, "0\n");
+    EXPECT_THAT(imei.err, HasSubstr("customer.xml:1:"));
+    remove_folder(folder);
+}
+
+TEST_F(ZelVerify, RefusesOptionsThatCannotGoTogether) {
+    make_phone();
+    for (const std::vector<std::string> &words : {std::vector<std::string>{"verify", "--imei", "--html", "page.html"},
+                                                  {"verify", "--imei", "--failures"},
+                                                  {"verify", "--json", "--html", "-"}}) {
+        const Outcome outcome = run_zel(words);
+        EXPECT_EQ(outcome.code, 2) << words[1];
+        EXPECT_EQ(outcome.out, "");
+        EXPECT_THAT(outcome.err, StartsWith("zel: verify: --"));
+    }
+    EXPECT_FALSE(exists(kReport)) << "nothing was done";
+}
+
+TEST_F(ZelVerify, PageGoesToStandardOutputInPlaceOfTheReport) {
+    make_phone();
+    const std::string folder = make_folder();
+    const Outcome outcome = run_zel({"verify", "--html", "-"});
+    EXPECT_EQ(outcome.code, 0);
+    EXPECT_THAT(outcome.out, StartsWith("<!DOCTYPE html>\n"));
+    run_zel({"verify", "--html", folder + "/page.html"});
+    EXPECT_EQ(outcome.out, content_of(folder + "/page.html"));
+    remove_folder(folder);
 }
 
 TEST_F(ZelVerify, WhoseReportCannotBeWrittenFails) {
@@ -250,6 +297,8 @@ TEST_F(ZelVerify, PageIsOneFile) {
     EXPECT_THAT(page, Not(HasSubstr("https://")));
     const Outcome outcome = run_zel({"verify", "--html", folder + "/missing/page.html"});
     EXPECT_EQ(outcome.code, 1);
-    EXPECT_THAT(outcome.err, HasSubstr("cannot write the page to '" + folder + "/missing/page.html'"));
+    EXPECT_THAT(outcome.err,
+                HasSubstr("cannot write the page to '" + folder + "/missing/page.html': No such file or directory\n"));
+    EXPECT_THAT(outcome.out, HasSubstr("FAILURE  CountryISO")) << "the values are printed all the same";
     remove_folder(folder);
 }

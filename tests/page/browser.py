@@ -115,6 +115,10 @@ class Page:
     def type(self, text: str) -> None:
         self.call("Input.insertText", text=text)
 
+    def press(self, key: str) -> None:
+        for kind in ("keyDown", "keyUp"):
+            self.call("Input.dispatchKeyEvent", type=kind, key=key, code=key, windowsVirtualKeyCode={"Tab": 9}[key])
+
     def screenshot(self, path: Path) -> None:
         image = self.call("Page.captureScreenshot", captureBeyondViewport=True)["data"]
         path.parent.mkdir(parents=True, exist_ok=True)

@@ -52,6 +52,12 @@ class VerifyPage(unittest.TestCase):
             assert done.returncode == 0, done.stderr
         cls.good = Path(cls.folder, "good.html")
         cls.good_code = zel(cls.root, "verify", "--html", str(cls.good)).returncode
+        spec = Path(cls.root, "opt/system/zel/mps/ZEL/Customer/TFG/customer.xml")
+        whole = spec.read_bytes()
+        spec.write_bytes(whole[:20000])
+        cls.cut = Path(cls.folder, "cut.html")
+        cls.cut_code = zel(cls.root, "verify", "--html", str(cls.cut)).returncode
+        spec.write_bytes(whole)
         # A phone that came off its package, in every kind of thing that the page shows.
         zel(cls.root, "vconf", "set", GPS_KEY, "0" if cls.key(GPS_KEY) == "1" else "1")
         zel(cls.root, "vconf", "set", "db/zel/country_iso", HOSTILE)
@@ -115,6 +121,16 @@ class VerifyPage(unittest.TestCase):
         self.assertIn("2 of ", summary)
         self.assertIn("Internal name\nTFG", summary)
         self.assertIn("1 of 3 results failed", summary)
+        self.assertEqual(page.run("[...document.querySelectorAll('dd.bad')].map(e => e.textContent.split(' ')[0])"),
+                         ["2", "2", "1"])
+        self.assertEqual(self.page(path=self.good).run("document.querySelectorAll('dd.bad, .problems').length"), 0)
+
+    def test_what_was_not_looked_at_is_said(self) -> None:
+        page = self.page(path=self.cut)
+        self.assertEqual(self.cut_code, 1)
+        self.assertEqual(page.run("document.querySelector('.verdict').textContent"), "INCOMPLETE")
+        self.assertEqual(page.run("document.querySelectorAll('.problems li').length"), 1)
+        self.assertIn("customer.xml:", page.run("document.querySelector('.problems').innerText"))
 
     def test_failures_come_first_in_their_groups_and_the_groups_with_them(self) -> None:
         page = self.page()
@@ -133,13 +149,16 @@ class VerifyPage(unittest.TestCase):
     def test_filter_shows_the_values_that_hold_every_word(self) -> None:
         page = self.page()
         shown = lambda: page.run(RENDERED % ".value" + ".map(e => e.children[1].textContent)")  # noqa: E731
+        count = lambda: page.run("document.getElementById('count').textContent")  # noqa: E731
         everything = shown()
+        self.assertEqual(count(), f"{len(everything)} of {len(everything)} values")
         page.run("document.getElementById('words').focus()")
         page.type("gps ACTIVATION")
         self.assertEqual(shown(), ["GPSActivation"])
+        self.assertEqual(count(), f"1 of {len(everything)} values")
         page.type(" nothing has this")
         self.assertEqual(shown(), [])
-        self.assertTrue(page.run("!document.getElementById('none').hidden"))
+        self.assertEqual(count(), f"0 of {len(everything)} values")
         page.run("words.value = ''; words.dispatchEvent(new Event('input'))")
         self.assertEqual(shown(), everything)
         page.run("failures.click()")
@@ -171,16 +190,39 @@ class VerifyPage(unittest.TestCase):
             self.assertEqual(page.run("[...document.querySelectorAll('.value *, .lap *, dl *, .filter *')].filter(e => {"
                                       f"const r = e.getBoundingClientRect(); return r.width && r.right > {width} + 0.5; }}).length"), 0)
 
+    def test_narrow_screen_breaks_no_number_and_squeezes_no_text(self) -> None:
+        page = self.page(320)
+        self.assertEqual(page.run("[...document.querySelectorAll('#media td')].filter(e => { const r = document.createRange();"
+                                  "r.selectNodeContents(e); return r.getClientRects().length > 1; }).length"), 0)
+        self.assertEqual(page.run("[...document.querySelectorAll('.value i, .value u')].filter(e =>"
+                                  "e.getBoundingClientRect().width < 180).length"), 0)
+
     def test_text_is_readable_in_both_schemes(self) -> None:
         for scheme in ("light", "dark"):
             page = self.page(scheme=scheme)
             ground = page.run("getComputedStyle(document.body).backgroundColor")
             self.assertEqual(luminance(ground) > 0.5, scheme == "light")
-            pairs = page.run("""[...document.querySelectorAll(`body, dt, h3 small, .verdict, .value b, .value.failed b, .value i,
+            pairs = page.run("""[...document.querySelectorAll(`body, dt, dd.bad, h3 small, .filter output, .verdict, .value b, .value.failed b, .value i,
                 td.changed, th, .lap span`)].map(e => { let g = e; while (getComputedStyle(g).backgroundColor === 'rgba(0, 0, 0, 0)')
                 g = g.parentElement; return [e.tagName + '.' + e.className, getComputedStyle(e).color, getComputedStyle(g).backgroundColor]; })""")
+            pairs.append(page.run("['placeholder', getComputedStyle(words, '::placeholder').color, getComputedStyle(words).backgroundColor]"))
             for name, text, behind in pairs:
                 self.assertGreaterEqual(contrast(text, behind), 4.5, f"{name} in {scheme}")
+
+    def test_page_can_be_heard_and_used_without_a_mouse(self) -> None:
+        page = self.page()
+        tree = [(node["role"]["value"], node.get("name", {}).get("value", ""))
+                for node in page.call("Accessibility.getFullAXTree")["nodes"] if not node["ignored"]]
+        for part in (("main", ""), ("heading", "Verification of UFN"), ("searchbox", "Filter values"),
+                     ("checkbox", "failures only"), ("region", "Media folders"), ("columnheader", "Bytes now"),
+                     ("rowheader", "image")):
+            self.assertIn(part, tree)
+        self.assertIn("status", [role for role, _ in tree])
+        reached = []
+        for _ in range(3):
+            page.press("Tab")
+            reached.append(page.run("document.activeElement.id || document.activeElement.className"))
+        self.assertEqual(reached, ["words", "failures", "wide"])
 
     def test_values_are_there_without_script_as_well(self) -> None:
         text = re.sub(r"<script>.*?</script>", "", self.page_path.read_text(), flags=re.S)
@@ -190,6 +232,7 @@ class VerifyPage(unittest.TestCase):
         self.assertGreater(page.run(RENDERED % ".value" + ".length"), 3)
 
     def test_screens_for_people_to_look_at(self) -> None:
+        self.page(NARROW, path=self.cut).screenshot(SHOTS / "verify-incomplete.png")
         for width, name in ((NARROW, "narrow"), (WIDE, "wide")):
             for scheme in ("light", "dark"):
                 shot = SHOTS / f"verify-{name}-{scheme}.png"

@@ -81,23 +81,31 @@ std::vector<Command> own_commands() {
         {.name = "verify",
          .parameters = {flag("imei", "the short answer of factory tools: how many values differ, and the first"),
                         flag("failures", "only what differs"),
-                        option("html", "FILE", "write one page for a browser as well, which needs no other file")},
+                        option("html", "FILE",
+                               "write all of it as one page for a browser as well, which needs no other file; "
+                               "with '-' in place of the report")},
          .help = "Compare the phone with the active customer's file, and write the report.",
-         .more = "Exits 4 when anything differs: a value of the customer's file, a media folder since the install, an "
-                 "application's result. Exits 1 without an active customer (--imei counts that as one difference), "
-                 "when its file cannot be read to its end, when there are more values than the library's 1000, or when "
-                 "the report cannot be written.\n"
-                 "Passwords are masked, in JSON and on the page too; --reveal shows them.\n"
-                 "Writes: \"/opt/system/zel-default/output/zel-verification-report.log\", \"zel-fs-status-verify.ini\" "
-                 "beside it, and the keys that 'zel version' writes.",
+         .more =
+             "Exits 4 when anything differs: a value of the customer's file, a media folder since the install, an "
+             "application's result. Exits 1 without an active customer (--imei counts that as one difference) and "
+             "when its file cannot be read to its end; without --imei also when there is no room for more values, or "
+             "when the report or the page cannot be written. Where values may be missing and none differs, the result "
+             "is INCOMPLETE.\n"
+             "Passwords are masked, in JSON and on the page too; --reveal shows them.\n"
+             "Writes: \"/opt/system/zel-default/output/zel-verification-report.log\", \"zel-fs-status-verify.ini\" "
+             "beside it, and the keys that 'zel version' writes.",
          .access = Access::kWrites,
          .run = verify},
         {.name = "export",
-         .parameters = {with_letter("o", option("output", "FILE", "write the document there, not to standard output")),
+         .parameters = {with_letter("o", option("output", "FILE",
+                                                "write the document there; without it, or with '-', it is "
+                                                "printed")),
                         flag("installable", "add the networks of the package, without which no profile installs")},
          .help = "Print the phone's settings as a customer's file.",
          .more = "What such a file cannot carry is listed in docs/export.md. Each value that could not be read, and "
-                 "each that holds '<', is named on standard error. Passwords are in the document as they are.\n"
+                 "each that holds '<', is named on standard error. Passwords are in the document as they are. "
+                 "--installable needs an active "
+                 "customer whose file can be read to its end.\n"
                  "Writes: \"/opt/system/zel-default/output/customer-phone.xml\".",
          .access = Access::kWrites,
          .run = export_phone},

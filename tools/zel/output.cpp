@@ -13,7 +13,8 @@ namespace {
 
 // A direction mark from a package could make a terminal show an address as another one.
 bool turns_direction(std::uint32_t code) {
-    return code == 0x200E || code == 0x200F || (code >= 0x202A && code <= 0x202E) || (code >= 0x2066 && code <= 0x2069);
+    return code == 0x061C || code == 0x200E || code == 0x200F || (code >= 0x202A && code <= 0x202E) ||
+           (code >= 0x2066 && code <= 0x2069);
 }
 
 bool is_control(std::uint32_t code) { return code < 0x20 || (code >= 0x7F && code < 0xA0); }

@@ -1,5 +1,6 @@
 #include "verification.h"
 
+#include "auto-flags.h"
 #include "package-check.h"
 #include "secrets.h"
 
@@ -9,6 +10,8 @@
 
 namespace zel_command {
 namespace {
+
+constexpr const char *kReportPath = "/opt/system/zel-default/output/zel-verification-report.log";
 
 bool take(std::string_view &text, std::string_view prefix) {
     if (!text.starts_with(prefix)) return false;
@@ -61,6 +64,22 @@ std::string package_version() {
     return version;
 }
 
+std::string active_customer() {
+    char customer[10] = {};
+    zel_svc_config_get_active_customer_name(customer, sizeof customer);
+    return customer;
+}
+
+void add_problems(Verification &found, const RunWatch &watch) {
+    found.problems = customer_file_problems(watch);
+    // The library's list holds no more, so there may have been more.
+    if (found.values.size() >= ZEL_SVC_MAX_RESULTS)
+        found.problems.push_back("there is no room for more than " + std::to_string(ZEL_SVC_MAX_RESULTS) +
+                                 " values; further ones may differ unseen");
+    found.complete = found.problems.empty();
+    if (!found.report_written) found.problems.push_back(std::string{"cannot write the report to "} + kReportPath);
+}
+
 } // namespace
 
 VerifiedValue verified_value(std::string_view line, bool passed) {
@@ -110,20 +129,30 @@ std::size_t Verification::failed() const {
         std::count_if(values.begin(), values.end(), [](const VerifiedValue &value) { return !value.passed; }));
 }
 
-bool Verification::is_full() const { return values.size() >= ZEL_SVC_MAX_RESULTS; }
+std::vector<std::string> customer_file_problems(const RunWatch &watch) {
+    std::vector<std::string> problems;
+    const std::string path = customer_file_path(active_customer());
+    for (const FileProblem &problem : watch.file_problems())
+        if (problem.path == path) problems.push_back(problem_text(problem));
+    return problems;
+}
 
-Verification verify_phone() {
+std::string Verification::verdict() const {
+    if (failed(VerifiedKind::kSpec) != 0) return "NOT OK";
+    return complete ? "OK" : "INCOMPLETE";
+}
+
+Verification verify_phone(const RunWatch &watch) {
     Verification found;
-    char customer[10] = {};
-    zel_svc_config_get_active_customer_name(customer, sizeof customer);
-    found.sales_code = customer;
-    found.internal_name = internal_name_of(customer);
+    found.sales_code = active_customer();
+    found.internal_name = internal_name_of(found.sales_code);
     found.package_version = package_version();
     std::vector<ZelSvcVerificationResult> results(ZEL_SVC_MAX_RESULTS);
     std::int32_t count = 0;
     found.report_written = zel_svc_config_verification(results.data(), &count) == 1;
     for (std::size_t i = 0; i < static_cast<std::size_t>(count); ++i)
         found.values.push_back(verified_value(results[i].text, results[i].passed == 1));
+    add_problems(found, watch);
     return found;
 }
 

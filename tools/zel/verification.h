@@ -1,11 +1,13 @@
 #pragma once
 // A verification as people and programs read it: the library's lines taken apart, in their order.
 //
-//     const Verification found = verify_phone();
+//     const RunWatch watch{verbose};
+//     const Verification found = verify_phone(watch);
 //     for (const VerifiedValue &value : found.values)
 //         if (!value.passed) ...
 
 #include "output.h"
+#include "run-watch.h"
 
 #include <cstddef>
 #include <string>
@@ -35,15 +37,20 @@ struct Verification {
     std::string internal_name; // of the folder that serves it
     std::vector<VerifiedValue> values;
     bool report_written = false;
+    bool complete = true;              // every value of the customer's file was compared
+    std::vector<std::string> problems; // what makes the answer worth less than it looks
 
     [[nodiscard]] std::size_t count(VerifiedKind kind) const;
     [[nodiscard]] std::size_t failed(VerifiedKind kind) const;
     [[nodiscard]] std::size_t failed() const;
-    // The library's list holds no more, so there may have been more.
-    [[nodiscard]] bool is_full() const;
+    // "OK", "NOT OK" or "INCOMPLETE", of the customer's file alone, as in the library's report.
+    [[nodiscard]] std::string verdict() const;
 };
 
-Verification verify_phone();
+Verification verify_phone(const RunWatch &watch);
+
+// Why the active customer's file was not read to its end; empty when it was.
+std::vector<std::string> customer_file_problems(const RunWatch &watch);
 
 // One line of the library's list.
 VerifiedValue verified_value(std::string_view line, bool passed);

@@ -25,22 +25,30 @@ h3 small { color: var(--dim); font-weight: normal; }
 dl { display: grid; grid-template-columns: max-content 1fr; gap: .15rem 1rem; margin: 0; }
 dt { color: var(--dim); }
 dd { margin: 0; }
+dd.bad { color: var(--bad); font-weight: 600; }
+.problems { margin: 0 0 1rem; padding: .5rem .8rem .5rem 1.8rem; border-left: .3rem solid var(--bad);
+  background: var(--bad-bg); }
 .filter { position: sticky; top: 0; display: flex; flex-wrap: wrap; gap: .5rem 1rem; align-items: center;
   padding: .5rem 0; background: var(--bg); border-bottom: 1px solid var(--line); }
 .filter input[type=search] { flex: 1 1 12rem; min-width: 0; padding: .4rem .6rem; font: inherit; color: inherit;
   background: var(--card); border: 1px solid var(--line); border-radius: .4rem; }
+.filter input::placeholder { color: var(--dim); opacity: 1; }
+.filter input[type=checkbox] { width: 1.1rem; height: 1.1rem; vertical-align: -.2rem; }
+.filter output { color: var(--dim); font-variant-numeric: tabular-nums; }
 .value { display: grid; grid-template-columns: 4.5rem minmax(8rem, 1fr) minmax(0, 1fr) minmax(0, 1fr);
   gap: 0 1rem; padding: .3rem .5rem; border-bottom: 1px solid var(--line); }
 .value.failed { background: var(--bad-bg); }
 .value b { color: var(--good); }
 .value.failed b { color: var(--bad); }
 .value i, .value u { font-style: normal; text-decoration: none; }
+.value i:last-child { grid-column: 3 / -1; }
 .value [data-is]::before { content: attr(data-is) ": "; color: var(--dim); }
 .wide { overflow-x: auto; }
-table { border-collapse: collapse; width: 100%; }
+table { border-collapse: collapse; width: 100%; overflow-wrap: normal; }
 th, td { padding: .25rem .5rem; text-align: right; border-bottom: 1px solid var(--line); }
-th:first-child, td:first-child { text-align: left; overflow-wrap: normal; }
-th { color: var(--dim); font-weight: normal; }
+th:first-child { text-align: left; }
+th { font-weight: normal; }
+th[scope=col] { color: var(--dim); vertical-align: bottom; }
 td.changed { color: var(--bad); background: var(--bad-bg); font-weight: 600; }
 .lap { display: grid; grid-template-columns: 12rem 1fr 5.5rem; gap: 0 .75rem; align-items: center;
   padding: .15rem 0; }
@@ -50,7 +58,8 @@ td.changed { color: var(--bad); background: var(--bad-bg); font-weight: 600; }
 [hidden] { display: none !important; }
 @media (max-width: 40rem) {
   .value { grid-template-columns: 4.5rem 1fr; }
-  .value [data-is] { grid-column: 2; }
+  .value i, .value u { grid-column: 2 / -1; }
+  .value i:last-child { grid-column: 2 / -1; }
   .lap { grid-template-columns: 1fr 5.5rem; }
   .lap svg { grid-row: 2; grid-column: 1 / -1; }
 }
@@ -60,10 +69,10 @@ inline constexpr std::string_view kPageScript = R"js(
 'use strict';
 const words = document.getElementById('words');
 const failures = document.getElementById('failures');
-const none = document.getElementById('none');
+const count = document.getElementById('count');
 function filter() {
   const wanted = words.value.toLowerCase().split(/\s+/).filter(Boolean);
-  let found = 0;
+  let found = 0, all = 0;
   for (const group of document.querySelectorAll('.group')) {
     let shown = 0;
     for (const value of group.querySelectorAll('.value')) {
@@ -72,11 +81,12 @@ function filter() {
         (!failures.checked || value.classList.contains('failed'));
       value.hidden = !fits;
       shown += fits;
+      all += 1;
     }
     group.hidden = shown === 0;
     found += shown;
   }
-  none.hidden = found !== 0;
+  count.textContent = found + ' of ' + all + ' values';
 }
 words.addEventListener('input', filter);
 failures.addEventListener('change', filter);
@@ -84,7 +94,7 @@ document.querySelector('.filter').hidden = false;
 filter();
 )js";
 
-inline constexpr std::string_view kPageStyleSum = "VJVRZcOheaifpss4ec0/9py2NZ2hZvLWg4nmt3Q8H4o=";
-inline constexpr std::string_view kPageScriptSum = "Uu6kR5Fx+nbFij4J/BxaGm7ED2uiEmHWS6JclU9HjPA=";
+inline constexpr std::string_view kPageStyleSum = "TAvSUfA2TeEyJqsXzCPBwS31QONL/X1+VZE3yDWwjJQ=";
+inline constexpr std::string_view kPageScriptSum = "FV0eXpYF4Lc+sL0Jpt8CrWTVk6NLQkjqPFdyMQf7A6A=";
 
 } // namespace zel_command

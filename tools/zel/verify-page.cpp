@@ -29,7 +29,7 @@ std::string head(const Verification &found) {
     text += "<meta http-equiv=\"Content-Security-Policy\" content=\"" + policy() + "\">\n";
     text += "<meta name=\"viewport\" content=\"width=device-width, initial-scale=1\">\n";
     text += element("title", "Verification of " + found.sales_code) + "\n";
-    return text.append("<style>").append(kPageStyle).append("</style>\n</head>\n<body>\n");
+    return text.append("<style>").append(kPageStyle).append("</style>\n</head>\n<body>\n<main>\n");
 }
 
 std::string fact(const std::string &name, std::string_view text) {
@@ -38,17 +38,30 @@ std::string fact(const std::string &name, std::string_view text) {
 
 std::string of(std::size_t failed, std::size_t all) { return std::to_string(failed) + " of " + std::to_string(all); }
 
+std::string count_fact(const Verification &found, VerifiedKind kind, const std::string &name, const std::string &what) {
+    const std::size_t failed = found.failed(kind);
+    return element("dt", name) +
+           element(failed == 0 ? "dd" : "dd class=\"bad\"", of(failed, found.count(kind)) + what) + "\n";
+}
+
+std::string problems(const Verification &found) {
+    if (found.problems.empty()) return {};
+    std::string text = "<ul class=\"problems\">\n";
+    for (const std::string &problem : found.problems)
+        text += element("li", problem) + "\n";
+    return text + "</ul>\n";
+}
+
 std::string summary(const Verification &found) {
-    const std::size_t failed = found.failed(VerifiedKind::kSpec);
+    const std::string verdict = found.verdict();
     std::string text = element("h1", "Verification of " + found.sales_code) + "\n";
-    text += failed == 0 ? element("p class=\"verdict ok\"", "OK") : element("p class=\"verdict not-ok\"", "NOT OK");
-    text += "\n<dl>\n" + fact("Package", found.package_version) + fact("Sales code", found.sales_code);
+    text += element(verdict == "OK" ? "p class=\"verdict ok\"" : "p class=\"verdict not-ok\"", verdict) + "\n";
+    text += problems(found) + "<dl>\n" + fact("Package", found.package_version);
+    text += fact("Sales code", found.sales_code);
     if (found.internal_name != found.sales_code) text += fact("Internal name", found.internal_name);
-    text += fact("Customer's file", of(failed, found.count(VerifiedKind::kSpec)) + " values differ");
-    text += fact("Media folders",
-                 of(found.failed(VerifiedKind::kMedia), found.count(VerifiedKind::kMedia)) + " figures changed");
-    text += fact("Applications", of(found.failed(VerifiedKind::kApplication), found.count(VerifiedKind::kApplication)) +
-                                     " results failed");
+    text += count_fact(found, VerifiedKind::kSpec, "Customer's file", " values differ");
+    text += count_fact(found, VerifiedKind::kMedia, "Media folders", " figures changed");
+    text += count_fact(found, VerifiedKind::kApplication, "Applications", " results failed");
     return text + "</dl>\n";
 }
 
@@ -88,7 +101,8 @@ std::string value_row(const VerifiedValue &value, bool reveal) {
 std::string values(const Verification &found, bool reveal) {
     std::string text = "<div id=\"values\">\n<h2>Values</h2>\n<div class=\"filter\" hidden>"
                        "<input type=\"search\" id=\"words\" placeholder=\"Filter values\" aria-label=\"Filter values\">"
-                       "<label><input type=\"checkbox\" id=\"failures\"> failures only</label></div>\n";
+                       "<label><input type=\"checkbox\" id=\"failures\"> failures only</label>"
+                       "<output id=\"count\" for=\"words failures\"></output></div>\n";
     for (const Group &group : groups_of(found)) {
         text += "<section class=\"group\" data-name=\"" + html_text(group.name) + "\">\n<h3>" + html_text(group.name);
         text += " <small>" + (group.failed == 0 ? std::to_string(group.values.size()) + " passed"
@@ -98,7 +112,7 @@ std::string values(const Verification &found, bool reveal) {
             text += value_row(*value, reveal);
         text += "</section>\n";
     }
-    return text + "<p id=\"none\" hidden>No value fits.</p>\n</div>\n";
+    return text + "</div>\n";
 }
 
 std::string media_cells(const VerifiedValue &value) {
@@ -114,11 +128,14 @@ std::string media(const Verification &found) {
         if (values[i].kind != VerifiedKind::kMedia || values[i + 1].kind != VerifiedKind::kMedia) break;
         const std::string &label = values[i].label; // "media/image size"
         const std::string name = label.substr(label.find('/') + 1, label.find(' ') - label.find('/') - 1);
-        rows += "<tr>" + element("td", name) + media_cells(values[i]) + media_cells(values[i + 1]) + "</tr>\n";
+        rows += "<tr>" + element("th scope=\"row\"", name) + media_cells(values[i]) + media_cells(values[i + 1]) +
+                "</tr>\n";
     }
     if (rows.empty()) return {};
-    return "<h2>Media folders</h2>\n<div class=\"wide\"><table id=\"media\">\n<tr><th>Folder</th><th>Bytes after the "
-           "install</th><th>now</th><th>Files after the install</th><th>now</th></tr>\n" +
+    return "<h2 id=\"folders\">Media folders</h2>\n<div class=\"wide\" role=\"region\" aria-labelledby=\"folders\" "
+           "tabindex=\"0\"><table id=\"media\">\n<tr><th scope=\"col\">Folder</th><th scope=\"col\">Bytes after the "
+           "install</th><th scope=\"col\">Bytes now</th><th scope=\"col\">Entries after the install</th>"
+           "<th scope=\"col\">Entries now</th></tr>\n" +
            rows + "</table></div>\n";
 }
 
@@ -153,7 +170,7 @@ std::string laps(const std::vector<TimeLap> &all) {
 std::string verify_page(const VerifyPage &page) {
     std::string text = head(page.found) + summary(page.found) + values(page.found, page.reveal);
     text += media(page.found) + laps(page.laps);
-    return text.append("<script>").append(kPageScript).append("</script>\n</body>\n</html>\n");
+    return text.append("</main>\n<script>").append(kPageScript).append("</script>\n</body>\n</html>\n");
 }
 
 } // namespace zel_command

@@ -1,9 +1,8 @@
 // Is this phone what its package says?
 
-#include "auto-flags.h"
 #include "commands.h"
 #include "failure.h"
-#include "package-check.h"
+#include "output-file.h"
 #include "time-laps.h"
 #include "verification.h"
 #include "verify-page.h"
@@ -12,13 +11,9 @@
 
 #include <base/zel-svc-text.h>
 
-#include <algorithm>
-#include <fstream>
-
 namespace zel_command {
 namespace {
 
-constexpr const char *kReportPath = "/opt/system/zel-default/output/zel-verification-report.log";
 constexpr const char *kLapPath = "/opt/system/zel-default/output/zel-time-lap.log";
 constexpr std::size_t kShownWidth = 60; // of a value in the table; the report and the page hold all of it
 
@@ -34,9 +29,10 @@ std::string sales_code_text(const Verification &found) {
 
 std::string result_text(const Verification &found) {
     const std::size_t failed = found.failed(VerifiedKind::kSpec);
-    const std::string all = std::to_string(found.count(VerifiedKind::kSpec)) + " values of the customer's file";
-    if (failed == 0) return "OK: the phone has all " + all;
-    return "NOT OK: the phone differs in " + std::to_string(failed) + " of " + all;
+    const std::string all = std::to_string(found.count(VerifiedKind::kSpec));
+    const std::string what = found.complete ? " values of the customer's file" : " values that could be compared";
+    if (failed == 0) return found.verdict() + ": the phone has all " + all + what;
+    return found.verdict() + ": the phone differs in " + std::to_string(failed) + " of " + all + what;
 }
 
 std::string failed_text(const Verification &found, VerifiedKind kind, const char *what) {
@@ -65,7 +61,7 @@ void print_values(const Verification &found, const Invocation &invocation) {
     print_table({"RESULT", "VALUE", "EXPECTED", "PHONE"}, rows);
 }
 
-void print_page(const Verification &found, const Invocation &invocation) {
+void print_report(const Verification &found, const Invocation &invocation) {
     print_table({}, {{"Package", found.package_version},
                      {"Sales code", sales_code_text(found)},
                      {"Result", result_text(found)},
@@ -89,28 +85,40 @@ void print_verification_json(const Verification &found, const Invocation &invoca
     put_text(answer, "package", found.package_version);
     put_text(answer, "sales_code", found.sales_code);
     put_text(answer, "internal_name", found.internal_name);
-    const std::size_t failed = found.failed(VerifiedKind::kSpec);
-    answer["ok"] = failed == 0;
-    answer["failed"] = Json{{"spec", failed},
+    answer["ok"] = found.verdict() == "OK";
+    answer["failed"] = Json{{"spec", found.failed(VerifiedKind::kSpec)},
                             {"media", found.failed(VerifiedKind::kMedia)},
                             {"applications", found.failed(VerifiedKind::kApplication)}};
     answer["values"] = Json::array();
     for (const VerifiedValue &value : found.values)
         if (!value.passed || !invocation.has("failures"))
             answer["values"].push_back(value_json(value, invocation.reveal));
+    answer["problems"] = Json::array();
+    for (const std::string &problem : found.problems)
+        put_text(answer["problems"].emplace_back(Json::object()), "problem", problem);
     print_json(answer);
 }
 
 // The page is about the phone, so the laps are those of its last install.
-void write_page(const Verification &found, const Invocation &invocation) {
+std::string page_of(const Verification &found, const Invocation &invocation) {
     Json answer;
     const bool has_laps = invocation.phone.try_call("read", {{"path", kLapPath}}, answer) == 0;
-    const std::string page = verify_page(
+    return verify_page(
         {found, has_laps ? time_laps(bytes_of(answer, "content")) : std::vector<TimeLap>{}, invocation.reveal});
+}
+
+void print_verification(const Verification &found, const Invocation &invocation) {
+    if (invocation.json) return print_verification_json(found, invocation);
+    if (invocation.has("html") && !invocation.names_file("html")) return print(page_of(found, invocation));
+    print_report(found, invocation);
+}
+
+// An empty text when there is nothing to say.
+std::string write_page(const Verification &found, const Invocation &invocation) {
+    if (!invocation.names_file("html")) return {};
     const std::string path = invocation.value("html");
-    std::ofstream file{path, std::ios::binary};
-    file << page;
-    if (!file.flush()) throw Failure{kFailed, "verify: cannot write the page to '" + path + "'"};
+    const std::string error = write_file(path, page_of(found, invocation));
+    return error.empty() ? error : "cannot write the page to '" + path + "': " + error;
 }
 
 void print_imei_answer(const Invocation &invocation, int failed, const std::string &line) {
@@ -124,45 +132,42 @@ void print_imei_answer(const Invocation &invocation, int failed, const std::stri
     if (!first.text.empty()) print_line(escaped_line(first.text));
 }
 
-int verify_for_imei(const Invocation &invocation) {
+// Each on standard error; the exit code that they make of another.
+int reported(const std::vector<std::string> &problems, int code) {
+    for (const std::string &problem : problems)
+        report("verify: " + problem);
+    return problems.empty() ? code : kFailed;
+}
+
+int verify_for_imei(const Invocation &invocation, const RunWatch &watch) {
     ZelSvcVerificationResult first{};
     const int failed = zel_svc_config_verification_for_imei(first.text, sizeof first.text);
     print_imei_answer(invocation, failed, first.text);
-    return failed == 0 ? kDone : kDifferences;
+    return reported(customer_file_problems(watch), failed == 0 ? kDone : kDifferences);
 }
 
-// What makes the answer worth less than it looks.
-std::vector<std::string> problems_of(const Verification &found, const RunWatch &watch) {
-    std::vector<std::string> problems;
-    const std::string path = customer_file_path(found.sales_code);
-    for (const FileProblem &problem : watch.file_problems())
-        if (problem.path == path) problems.push_back(problem_text(problem));
-    if (!found.report_written) problems.push_back(std::string{"cannot write the report to "} + kReportPath);
-    if (found.is_full())
-        problems.push_back("there is no room for more than " + std::to_string(ZEL_SVC_MAX_RESULTS) +
-                           " values; further ones may differ unseen");
-    return problems;
+// Words that would not do what they say.
+void check_options(const Invocation &invocation) {
+    if (invocation.has("imei") && (invocation.has("failures") || invocation.has("html")))
+        throw Failure{kUsage, "verify: --imei prints two lines and goes with neither --failures nor --html"};
+    if (invocation.json && invocation.has("html") && !invocation.names_file("html"))
+        throw Failure{kUsage, "verify: --json and --html - both want standard output"};
 }
 
 } // namespace
 
 int verify(Invocation &invocation) {
+    check_options(invocation);
     if (zel_svc_config_chk_active_customer_exist() == 0 && !invocation.has("imei"))
         throw Failure{kFailed, "verify: the phone in '" + invocation.root + "' has no active customer",
                       "Configure it with 'zel install CUSTOMER' first."};
     const RunWatch watch{invocation.verbose};
-    if (invocation.has("imei")) return verify_for_imei(invocation);
-    const Verification found = verify_phone();
-    if (invocation.json)
-        print_verification_json(found, invocation);
-    else
-        print_page(found, invocation);
-    if (invocation.has("html")) write_page(found, invocation);
-    const std::vector<std::string> problems = problems_of(found, watch);
-    for (const std::string &problem : problems)
-        report("verify: " + problem);
-    if (!problems.empty()) return kFailed;
-    return found.failed() == 0 ? kDone : kDifferences;
+    if (invocation.has("imei")) return verify_for_imei(invocation, watch);
+    const Verification found = verify_phone(watch);
+    print_verification(found, invocation);
+    std::vector<std::string> problems = found.problems;
+    if (std::string problem = write_page(found, invocation); !problem.empty()) problems.push_back(std::move(problem));
+    return reported(problems, found.failed() == 0 ? kDone : kDifferences);
 }
 
 } // namespace zel_command
