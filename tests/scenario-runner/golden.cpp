@@ -42,6 +42,22 @@ std::vector<std::vector<std::size_t>> common_lengths(const std::vector<std::stri
     return lengths;
 }
 
+// A long section that is gone as a whole is told in one line.
+std::vector<std::string> shortened(std::vector<std::string> difference, std::size_t size_before) {
+    constexpr std::size_t kLong = 50;
+    const auto is_lost = [](const std::string &line) { return line.starts_with("- "); };
+    const auto lost = static_cast<std::size_t>(std::count_if(difference.begin(), difference.end(), is_lost));
+    if (size_before < kLong || lost < size_before) return difference;
+    std::erase_if(difference, is_lost);
+    difference.insert(difference.begin(), "- all " + std::to_string(size_before) + " lines");
+    return difference;
+}
+
+std::vector<std::string> section_of(const PhoneState &state, const std::string &name) {
+    const auto found = state.find(name);
+    return found == state.end() ? std::vector<std::string>{} : found->second;
+}
+
 } // namespace
 
 std::vector<std::string> line_difference(const std::vector<std::string> &before,
@@ -60,6 +76,19 @@ std::vector<std::string> line_difference(const std::vector<std::string> &before,
             difference.push_back("+ " + after[j++]);
         }
     }
+    return difference;
+}
+
+std::vector<std::string> state_difference(const PhoneState &before, const PhoneState &after) {
+    std::vector<std::string> difference;
+    const auto add = [&](const std::string &name, const std::vector<std::string> &lines) {
+        for (const std::string &line : shortened(line_difference(lines, section_of(after, name)), lines.size()))
+            difference.push_back(line.substr(0, 2) + name + ": " + line.substr(2));
+    };
+    for (const auto &[name, lines] : before)
+        add(name, lines);
+    for (const auto &section : after)
+        if (!before.contains(section.first)) add(section.first, {});
     return difference;
 }
 

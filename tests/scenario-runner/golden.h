@@ -14,4 +14,7 @@ int compare_with_golden(const PhoneState &state, const std::filesystem::path &fo
 // The lines that only one side has, as "- line" and "+ line", in order. Equal lines are not shown.
 std::vector<std::string> line_difference(const std::vector<std::string> &before, const std::vector<std::string> &after);
 
+// The same for all sections, as "- SECTION: line". A long section of which nothing is left is one line.
+std::vector<std::string> state_difference(const PhoneState &before, const PhoneState &after);
+
 } // namespace zel_scenario

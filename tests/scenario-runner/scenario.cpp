@@ -71,7 +71,7 @@ ScenarioRun::ScenarioRun(const Scenario &scenario) : scenario_{scenario}, phone_
 }
 
 void ScenarioRun::do_step(const ScenarioStep &step) {
-    if (step.word == "create" || step.word == "fail") return;
+    if (step.word == "create" || step.word == "fail" || step.word == "again") return;
     if (step.word == "package") {
         const fs::path package =
             step.rest == "example" ? fs::path{ZEL_SOURCE_DIR} / "examples/package" : scenario_.folder / step.rest;

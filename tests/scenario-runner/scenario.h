@@ -11,6 +11,7 @@
 //                                        kept with what is printed
 //         restart                        the phone restarts
 //         fail bookmark_zel_ sync_       a fault loop fails only functions that begin so; all without it
+//         again                          a fault loop does what follows for each fault, all on one phone
 //     NAME/phone-before/  files laid into the phone's root before the first step
 //     NAME/package/       a package of the scenario's own
 //     NAME/expected/      golden files, one a section of the phone's state, plus `output`
