@@ -17,6 +17,7 @@ constexpr const char *kDocumentPath = "/opt/system/zel-default/output/customer-p
 // Null when memory ran out.
 ZelSvcOwnedText phone_as_document() {
     const ZelSvcRecordedGroups groups;
+    if (!groups.is_whole()) return {};
     zel_svc_set_network_db_path(ZEL_SVC_NETWORK_DB_PATH_SIM1);
     geZelSvcParseMode = ZEL_SVC_PARSE_MODE_HEADER;
     char *document = nullptr;

@@ -9,7 +9,7 @@ class ZelSvcRecordedGroups {
   public:
     ZelSvcRecordedGroups() {
         for (int group = 0; group < ZEL_SVC_DATA_GROUP_COUNT; ++group)
-            zel_svc_guarded([group] { zel_svc_data_load(group, ZEL_SVC_DATA_SIM1, 0); });
+            load(group);
     }
     ZelSvcRecordedGroups(const ZelSvcRecordedGroups &) = delete;
     ZelSvcRecordedGroups &operator=(const ZelSvcRecordedGroups &) = delete;
@@ -17,4 +17,17 @@ class ZelSvcRecordedGroups {
         for (int group = 0; group < ZEL_SVC_DATA_GROUP_COUNT; ++group)
             zel_svc_data_free(group);
     }
+
+    // Whether there was memory for all that the files hold.
+    [[nodiscard]] bool is_whole() const { return is_whole_; }
+
+  private:
+    void load(int group) {
+        is_whole_ &= zel_svc_guarded_or(false, [group] {
+            zel_svc_data_load(group, ZEL_SVC_DATA_SIM1, 0);
+            return true;
+        });
+    }
+
+    bool is_whole_ = true;
 };

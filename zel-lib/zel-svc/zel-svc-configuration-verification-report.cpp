@@ -14,8 +14,9 @@ std::string_view text_of(const ZelSvcVerificationResult &entry) {
 }
 
 std::string head(const ZelSvcVerifiedPhone &phone) {
-    std::string text = "ZEL Version : " + phone.package_version + "\nSales code : " + phone.sales_code;
-    if (!phone.internal_name.empty()) text += "(internal:" + phone.internal_name + ")";
+    std::string text{"ZEL Version : "};
+    text.append(phone.package_version.view()).append("\nSales code : ").append(phone.sales_code.view());
+    if (!phone.internal_name.empty()) text.append("(internal:").append(phone.internal_name.view()).append(")");
     return text + '\n';
 }
 
@@ -39,9 +40,12 @@ std::string lines(const ZelSvcResultList &list) {
 
 bool zel_svc_config_write_report(const ZelSvcVerifiedPhone &phone, const ZelSvcResultList &list, int failed) {
     zel_svc_file_remove(ZEL_SVC_REPORT_PATH);
-    ZelSvcFd report = zel_svc_file_open(ZEL_SVC_REPORT_PATH, O_WRONLY | O_CREAT | O_APPEND, 0644);
+    // Put together before there is a file: without memory there is no report rather than an empty one.
+    const std::string text = head(phone) + summary(list.entries().size(), failed) + lines(list);
+    // One that could not be removed must not stand in front of this one.
+    ZelSvcFd report = zel_svc_file_open(ZEL_SVC_REPORT_PATH, O_WRONLY | O_CREAT | O_TRUNC | O_APPEND, 0644);
     if (!report) return false;
-    zel_svc_file_write_all(report.get(), head(phone) + summary(list.entries().size(), failed) + lines(list));
+    zel_svc_file_write_all(report.get(), text);
     report.close();
     zel_svc_file_set_output_attr(ZEL_SVC_REPORT_PATH, "*");
     return true;

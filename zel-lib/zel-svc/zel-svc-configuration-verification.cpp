@@ -14,7 +14,6 @@ namespace {
 
 using SalesCode = FixedText<ZEL_SVC_SALES_CODE_SIZE>;
 constexpr int kCodeSize = SalesCode::width;
-constexpr int kVersionSize = 20;
 
 // Empty without an active customer.
 SalesCode active_customer() {
@@ -29,14 +28,12 @@ struct Verified {
 };
 
 Verified who_is_verified() {
-    const SalesCode code = active_customer();
     Verified verified;
+    auto &[version, code, internal_name] = verified.phone;
+    code = active_customer();
     const int differs = zel_svc_config_get_internal_customer_name(code.c_str(), verified.folder.data(), kCodeSize);
-    FixedText<kVersionSize> version;
-    zel_svc_config_get_zel_bin_version(version.data(), kVersionSize);
-    verified.phone = {.package_version = version.c_str(),
-                      .sales_code = code.c_str(),
-                      .internal_name = differs == 1 ? verified.folder.c_str() : ""};
+    if (differs == 1) internal_name = verified.folder;
+    zel_svc_config_get_zel_bin_version(version.data(), static_cast<int>(version.width));
     return verified;
 }
 

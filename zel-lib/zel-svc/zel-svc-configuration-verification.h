@@ -1,10 +1,11 @@
 #pragma once
 // The parts of a verification, in the order in which it has them. Each adds its lines to one list.
 
+#include "base/zel-svc-active-customer.h"
+#include "base/zel-svc-text.h"
 #include "zel-svc.h"
 
 #include <span>
-#include <string>
 #include <string_view>
 
 // A caller's list of ZEL_SVC_MAX_RESULTS entries and its count. What comes when it is full is lost.
@@ -39,9 +40,9 @@ int zel_svc_config_verify_spec(std::string_view customer, ZelSvcResultList &list
 
 // Who was verified, as the report's head tells.
 struct ZelSvcVerifiedPhone {
-    std::string package_version;
-    std::string sales_code;
-    std::string internal_name; // empty when it is the sales code
+    FixedText<20> package_version;
+    FixedText<ZEL_SVC_SALES_CODE_SIZE> sales_code;
+    FixedText<ZEL_SVC_SALES_CODE_SIZE> internal_name; // empty when it is the sales code
 };
 
 inline constexpr const char *ZEL_SVC_REPORT_PATH = "/opt/system/zel-default/output/zel-verification-report.log";

@@ -153,16 +153,16 @@ std::string recorded_count() { return zel_svc_number_text(zel_svc_data_get_int(k
 
 void verify_count(const Occurrence &occurrence) {
     if (!zel_svc_group_applies(occurrence, ZEL_SVC_AUTO_FAST_DORMANCY)) return;
-    zel_svc_field_compare("FastDormancy", {.label = occurrence.tag}, occurrence.text, recorded_count());
     gIndex = 0;
+    zel_svc_field_compare("FastDormancy", {.label = occurrence.tag}, occurrence.text, recorded_count());
 }
 
 void count(Occurrence &occurrence) {
     if (occurrence.verifies()) return verify_count(occurrence);
     zel_svc_for_each_mccmnc(occurrence, ZEL_SVC_AUTO_FAST_DORMANCY, __zel_svc_fast_dormancy_delete);
     if (!occurrence.exports()) return;
-    if (occurrence.out) occurrence.out->assign(recorded_count());
     gIndex = 0;
+    if (occurrence.out) occurrence.out->assign(recorded_count());
 }
 
 } // namespace

@@ -25,7 +25,6 @@
 
 #include <cstdint>
 #include <memory>
-#include <new>
 #include <optional>
 #include <span>
 #include <string>
@@ -114,11 +113,11 @@ template <class R> const Field<R> *zel_svc_field_find(std::span<const Field<R>> 
 // The one record of its kind that is open, if any.
 template <class R> class OpenRecord {
   public:
-    // Frees what was open and opens a zeroed record. Out of memory there is none, and the element's values
-    // and end do nothing.
+    // Frees what was open and opens a zeroed record. Out of memory, which an exception tells, there is none, and
+    // the element's values and end do nothing.
     void open() {
         record_.reset();
-        record_.reset(new (std::nothrow) R{});
+        record_ = std::make_unique<R>();
     }
     // Keeps a record that is already open.
     void open_unless_pending() {

@@ -67,8 +67,11 @@ void zel_svc_data_load(int group, unsigned variant, int create) {
     const ZelSvcFd file = create == 1 ? create_file(path.text) : zel_svc_file_open(path.text, O_RDONLY);
     ZelSvcDataGroupState &state = zel_svc_data_group(group);
     ZelSvcIni dictionary = ZelSvcIni::load(file.get());
+    ZelSvcDataEntries entries;
     for (const auto &[name, value] : dictionary.entries())
-        state.entries.put(name, value ? value : "", value ? Form::Loaded : Form::Section);
+        entries.put(name, value ? value : "", value ? Form::Loaded : Form::Section);
+    // Without memory for all of them the group stays unloaded.
+    state.entries = std::move(entries);
     state.dictionary = std::move(dictionary);
 }
 

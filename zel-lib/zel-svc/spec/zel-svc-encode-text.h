@@ -18,6 +18,9 @@ class ZelSvcEncodeText {
     // document must not look like a whole one.
     void put(std::string_view bytes);
 
+    // The same for something that there was no memory to ask for.
+    void drop_rest() { failed_ = true; }
+
     [[nodiscard]] bool is_whole() const { return !failed_; }
     [[nodiscard]] std::string_view view() const { return {bytes_ ? bytes_ : "", size_}; }
 

@@ -7,6 +7,7 @@
 #include "spec/zel-svc-xml.h"
 
 #include <algorithm>
+#include <new>
 
 namespace {
 
@@ -15,9 +16,9 @@ constexpr std::size_t kIndentation = 2;
 
 const ZelSvcElement &row_of(ZelSvcElementId id) { return kZelSvcElementTable.at(static_cast<std::size_t>(id)); }
 
-// What a handler gives out for the element that is open.
-void call(Handler handler, OccurrenceKind kind, ZelSvcElementId id, ZelSvcExportText *out) {
-    if (!handler) return;
+// What a handler gives out for the element that is open. False when it had no memory.
+bool call(Handler handler, OccurrenceKind kind, ZelSvcElementId id, ZelSvcExportText *out) {
+    if (!handler) return true;
     Occurrence occurrence{
         .kind = kind,
         .element = id,
@@ -30,7 +31,10 @@ void call(Handler handler, OccurrenceKind kind, ZelSvcElementId id, ZelSvcExport
         .attributes = nullptr,
         .out = out,
     };
-    zel_svc_guarded([&] { handler(occurrence); });
+    return zel_svc_guarded_or(false, [&] {
+        handler(occurrence);
+        return true;
+    });
 }
 
 } // namespace
@@ -46,7 +50,7 @@ void ZelSvcEncodeWriter::indent() {
 void ZelSvcEncodeWriter::start_element(ZelSvcElementId id) {
     zel_svc_element_push(id);
     ZelSvcExportText attributes;
-    call(row_of(id).start, OccurrenceKind::Start, id, &attributes);
+    if (!call(row_of(id).start, OccurrenceKind::Start, id, &attributes)) text_.drop_rest();
     text_.put("<");
     text_.put(row_of(id).tag);
     if (!attributes.empty()) text_.put(" ");
@@ -57,13 +61,13 @@ void ZelSvcEncodeWriter::start_element(ZelSvcElementId id) {
 // Only "&" is escaped: the reader of these documents knows no other character that must be.
 void ZelSvcEncodeWriter::value(ZelSvcElementId id) {
     ZelSvcExportText text;
-    call(row_of(id).value, OccurrenceKind::Value, id, &text);
+    if (!call(row_of(id).value, OccurrenceKind::Value, id, &text)) text_.drop_rest();
     const ZelSvcOwnedText escaped{zel_svc_str_replace_all(text.c_str(), "&", "&amp;")};
     text_.put(escaped ? std::string_view{escaped.get()} : text.view());
 }
 
 void ZelSvcEncodeWriter::end_element(ZelSvcElementId id) {
-    call(row_of(id).end, OccurrenceKind::End, id, nullptr);
+    if (!call(row_of(id).end, OccurrenceKind::End, id, nullptr)) text_.drop_rest();
     // A second address finds its place by the number of those that have ended.
     if (row_of(id).repeats) zel_svc_element_count_up(id);
     const ZelSvcElementId top = zel_svc_element_pop();
@@ -105,7 +109,8 @@ void ZelSvcEncodeWriter::empty_leaf(ZelSvcElementId id) {
 ZelSvcExportText zel_svc_encode_query(ZelSvcElementId id) {
     ZelSvcExportText text;
     const bool pushed = zel_svc_element_push(id) == 1;
-    call(row_of(id).value, OccurrenceKind::Value, id, &text);
+    const bool asked = call(row_of(id).value, OccurrenceKind::Value, id, &text);
     if (pushed) zel_svc_element_pop();
+    if (!asked) throw std::bad_alloc{};
     return text;
 }

@@ -38,5 +38,5 @@ class ZelSvcEncodeWriter {
     std::size_t indentation_ = 0;
 };
 
-// The value of an element, which is not written anywhere.
+// The value of an element, which is not written anywhere. std::bad_alloc when its handler had no memory.
 ZelSvcExportText zel_svc_encode_query(ZelSvcElementId id);

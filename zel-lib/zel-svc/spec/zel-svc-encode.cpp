@@ -1,9 +1,12 @@
 #include "spec/zel-svc-encode.h"
 
+#include "base/zel-svc-guard.h"
 #include "spec/zel-svc-element-dispatcher.h"
 #include "spec/zel-svc-encode-sequence.h"
 #include "spec/zel-svc-encode-writer.h"
 #include "spec/zel-svc-parse-context.h"
+
+#include <optional>
 
 namespace {
 
@@ -11,7 +14,7 @@ using Kind = ZelSvcEncodeStep::Kind;
 
 class Document {
   public:
-    explicit Document(ZelSvcEncodeText &text) : writer_(text) {}
+    explicit Document(ZelSvcEncodeText &text) : text_(text), writer_(text) {}
 
     void write() {
         writer_.header();
@@ -23,11 +26,19 @@ class Document {
     // Each gives the place behind what it wrote.
     std::size_t write_step(std::size_t at) {
         const ZelSvcEncodeStep &step = steps_[at];
-        const int times = step.times ? step.times() : 1;
+        const int times = times_of(step);
         if (step.kind != Kind::Open) return write_leaf(at, times);
         for (int i = 0; i < times; ++i)
             write_container(at);
         return zel_svc_encode_behind(steps_, at);
+    }
+
+    // None where there is no memory to find out, and then there is no document either.
+    int times_of(const ZelSvcEncodeStep &step) {
+        if (!step.times) return 1;
+        const auto times = zel_svc_guarded_or(std::optional<int>{}, [&] { return std::optional{step.times()}; });
+        if (!times) text_.drop_rest();
+        return times.value_or(0);
     }
 
     std::size_t write_leaf(std::size_t at, int times) {
@@ -45,6 +56,7 @@ class Document {
     }
 
     std::span<const ZelSvcEncodeStep> steps_ = zel_svc_encode_sequence();
+    ZelSvcEncodeText &text_;
     ZelSvcEncodeWriter writer_;
 };
 
