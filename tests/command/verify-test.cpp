@@ -114,12 +114,13 @@ TEST_F(ZelVerify, JsonHoldsEveryValue) {
 
 TEST_F(ZelVerify, JsonIsValidForAnyBytesOfThePhone) {
     make_phone("<GeneralInfo><CountryISO>GB</CountryISO></GeneralInfo>");
-    set_string("db/zel/country_iso", "\x1B[31m\"\n',Phone='x");
+    set_string("db/zel/country_iso", "\x1B[31m\"\n\xD8\x9C\xE2\x80\xAE',Phone='x");
     const nlohmann::json value = json_that_differs({"verify"})["values"][3];
     EXPECT_EQ(value["value"], "CountryISO");
-    EXPECT_EQ(value["phone"], "\x1B[31m\"\n',Phone='x");
+    EXPECT_EQ(value["phone"], "\x1B[31m\"\n\xD8\x9C\xE2\x80\xAE',Phone='x");
     const std::string shown = run_zel_on_terminal({"verify"}).out;
     EXPECT_EQ(shown.find('\x1B'), std::string::npos);
+    EXPECT_THAT(shown, HasSubstr("\\x0A\\u{061C}\\u{202E}'"));
 }
 
 TEST_F(ZelVerify, LongValuesAreShortInTheTableAndWholeInJson) {

@@ -102,10 +102,9 @@ std::vector<Command> own_commands() {
                                                 "printed")),
                         flag("installable", "add the networks of the package, without which no profile installs")},
          .help = "Print the phone's settings as a customer's file.",
-         .more = "What such a file cannot carry is listed in docs/export.md. Each value that could not be read, and "
-                 "each that holds '<', is named on standard error. Passwords are in the document as they are. "
-                 "--installable needs an active "
-                 "customer whose file can be read to its end.\n"
+         .more = "What such a file cannot carry is listed in docs/export.md. Each '?\?', which stands for a value that "
+                 "could not be read, and each value that holds '<' is named on standard error. Passwords are in the "
+                 "document as they are. --installable needs an active customer whose file can be read to its end.\n"
                  "Writes: \"/opt/system/zel-default/output/customer-phone.xml\".",
          .access = Access::kWrites,
          .run = export_phone},
