@@ -194,6 +194,7 @@ class VerifyPage(unittest.TestCase):
         page = self.page(320)
         self.assertEqual(page.run("[...document.querySelectorAll('#media td')].filter(e => { const r = document.createRange();"
                                   "r.selectNodeContents(e); return r.getClientRects().length > 1; }).length"), 0)
+        self.assertEqual(page.run("(e => e.scrollWidth - e.clientWidth)(document.querySelector('.wide'))"), 0)
         self.assertEqual(page.run("[...document.querySelectorAll('.value i, .value u')].filter(e =>"
                                   "e.getBoundingClientRect().width < 180).length"), 0)
 

@@ -60,6 +60,8 @@ td.changed { color: var(--bad); background: var(--bad-bg); font-weight: 600; }
   .value { grid-template-columns: 4.5rem 1fr; }
   .value i, .value u { grid-column: 2 / -1; }
   .value i:last-child { grid-column: 2 / -1; }
+  table { font-size: .9rem; }
+  th, td { padding-inline: .25rem; }
   .lap { grid-template-columns: 1fr 5.5rem; }
   .lap svg { grid-row: 2; grid-column: 1 / -1; }
 }
@@ -94,7 +96,7 @@ document.querySelector('.filter').hidden = false;
 filter();
 )js";
 
-inline constexpr std::string_view kPageStyleSum = "TAvSUfA2TeEyJqsXzCPBwS31QONL/X1+VZE3yDWwjJQ=";
+inline constexpr std::string_view kPageStyleSum = "8K/vmXGx8pybrM7W1+Sr8ChTtpolGK6pErBx+v2687E=";
 inline constexpr std::string_view kPageScriptSum = "FV0eXpYF4Lc+sL0Jpt8CrWTVk6NLQkjqPFdyMQf7A6A=";
 
 } // namespace zel_command

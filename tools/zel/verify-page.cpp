@@ -134,8 +134,8 @@ std::string media(const Verification &found) {
     if (rows.empty()) return {};
     return "<h2 id=\"folders\">Media folders</h2>\n<div class=\"wide\" role=\"region\" aria-labelledby=\"folders\" "
            "tabindex=\"0\"><table id=\"media\">\n<tr><th scope=\"col\">Folder</th><th scope=\"col\">Bytes after the "
-           "install</th><th scope=\"col\">Bytes now</th><th scope=\"col\">Entries after the install</th>"
-           "<th scope=\"col\">Entries now</th></tr>\n" +
+           "install</th><th scope=\"col\">Bytes now</th><th scope=\"col\">Items after the install</th>"
+           "<th scope=\"col\">Items now</th></tr>\n" +
            rows + "</table></div>\n";
 }
 
