@@ -71,6 +71,24 @@ TEST_F(Encode, WithoutMemoryForAllOfItIsNoDocument) {
     EXPECT_GT(allowed, 3);
 }
 
+// A start, a value, an end, and a count that is asked for its items.
+TEST_F(Encode, WithoutMemoryForAHandlerIsNoDocumentThoughAllOthersAreAsked) {
+    document();
+    const std::size_t asked = zel_test::calls().size();
+    for (const char *call : {"start DNS", "value GPSActivation", "end Settings", "value NbProfile"}) {
+        zel_test::calls().clear();
+        gives("value NbProfile", call == std::string{"start DNS"} ? "1" : "");
+        gives(call, "no memory");
+        char *bytes = nullptr;
+        EXPECT_EQ(zel_svc_spec_encode_xml(&bytes), 0) << call;
+        EXPECT_EQ(bytes, nullptr);
+        EXPECT_GE(zel_test::calls().size(), asked) << call;
+        EXPECT_EQ(zel_svc_element_get_current_id(), ZEL_SVC_ELEMENT_NONE);
+        zel_test::export_texts().clear();
+    }
+    EXPECT_NE(document(), "");
+}
+
 TEST_F(Encode, ItemsFollowTheirCounts) {
     for (const auto &[count, item] : {std::pair{"NbBookmark", "Bookmark"},
                                       {"NbQuickAccess", "QuickAccess"},

@@ -128,3 +128,9 @@ TEST_F(EncodeWriter, QueryGivesAValueAndWritesNothing) {
     EXPECT_EQ(zel_test::calls().at(0).occurrence.element, ZEL_SVC_ELEMENT_NB_PROFILE);
     EXPECT_EQ(zel_svc_element_get_current_id(), ZEL_SVC_ELEMENT_NONE);
 }
+
+TEST_F(EncodeWriter, QueryOfAHandlerWithoutMemoryTellsItAndLeavesNothingOpen) {
+    gives("value NbProfile", "no memory");
+    EXPECT_THROW(zel_svc_encode_query(ZEL_SVC_ELEMENT_NB_PROFILE), std::bad_alloc);
+    EXPECT_EQ(zel_svc_element_get_current_id(), ZEL_SVC_ELEMENT_NONE);
+}

@@ -11,6 +11,8 @@ namespace {
 
 int gBegunParses = 0;
 
+constexpr std::string_view kNoMemory = "no memory"; // the text that a handler has none for
+
 std::string attributes_of(const ZelSvcXmlAttribute *attribute) {
     std::string text;
     for (; attribute; attribute = attribute->next)
@@ -25,8 +27,9 @@ void record(const char *kind, std::size_t row, Occurrence &occurrence) {
     if (static_cast<std::size_t>(occurrence.element) != row) text += " in " + std::string(occurrence.tag);
     calls().push_back({text, occurrence});
     const auto given = export_texts().find(text);
-    if (occurrence.out && given != export_texts().end()) occurrence.out->assign(given->second);
-    if (occurrence.text == "no memory") throw std::bad_alloc();
+    const bool gives = given != export_texts().end();
+    if (occurrence.out && gives) occurrence.out->assign(given->second);
+    if (occurrence.text == kNoMemory || (gives && given->second == kNoMemory)) throw std::bad_alloc();
 }
 
 template <std::size_t Row> constexpr ZelSvcElement recording_row() {

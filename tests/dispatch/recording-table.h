@@ -19,6 +19,7 @@ std::vector<Call> &calls();
 std::vector<std::string> call_texts();
 
 // What a handler gives out in an export: of "start Wallpaper" an attribute text, of "value GPS" a value.
+// For "no memory" it throws, as for a text of a parse that says so.
 std::map<std::string, std::string> &export_texts();
 
 // How often a parse began.

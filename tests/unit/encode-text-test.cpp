@@ -63,6 +63,16 @@ TEST(EncodeText, DropsWhatComesBehindAFailedAllocation) {
     }
 }
 
+TEST(EncodeText, WhoseRestIsDroppedIsNone) {
+    ZelSvcEncodeText text;
+    text.put("one");
+    text.drop_rest();
+    text.put("two");
+    EXPECT_EQ(text.view(), "one");
+    EXPECT_FALSE(text.is_whole());
+    EXPECT_EQ(text.release(), nullptr);
+}
+
 TEST(EncodeText, WithoutRoomForTheTerminatorIsNone) {
     gAllocations = 0;
     gAllowed = 1;

@@ -99,11 +99,13 @@ int zel_svc_config_get_first_customer_name_in_zel_bin(char *buffer, int size) {
 
 int zel_svc_config_get_zel_bin_version(char *buffer, int size) {
     if (!buffer || size < 1) return 0;
+    // Unknown, too, where there is no memory to find out.
+    zel_svc_text_copy(buffer, zel_svc_buffer_size(size), kUnknownVersion);
     return zel_svc_guarded_or(0, [=] {
         const std::string version = package_version();
-        const bool known = !version.empty();
-        zel_svc_text_copy(buffer, zel_svc_buffer_size(size), known ? std::string_view{version} : kUnknownVersion);
-        return known ? 1 : 0;
+        if (version.empty()) return 0;
+        zel_svc_text_copy(buffer, zel_svc_buffer_size(size), version);
+        return 1;
     });
 }
 
