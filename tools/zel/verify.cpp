@@ -149,7 +149,7 @@ int verify_for_imei(const Invocation &invocation, const RunWatch &watch) {
 // Words that would not do what they say.
 void check_options(const Invocation &invocation) {
     if (invocation.has("imei") && (invocation.has("failures") || invocation.has("html")))
-        throw Failure{kUsage, "verify: --imei prints two lines and goes with neither --failures nor --html"};
+        throw Failure{kUsage, "verify: --imei goes with neither --failures nor --html"};
     if (invocation.json && invocation.has("html") && !invocation.names_file("html"))
         throw Failure{kUsage, "verify: --json and --html - both want standard output"};
 }
