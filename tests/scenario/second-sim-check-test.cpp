@@ -6,12 +6,12 @@
 
 #include <gmock/gmock.h>
 
-#include <memory>
-#include <span>
-
 namespace {
 
+using ::testing::Contains;
 using ::testing::HasSubstr;
+using ::testing::Not;
+using ::testing::StartsWith;
 
 constexpr const char *kFile =
     "<GeneralInfo><SalesCode>BTU</SalesCode><NetworkInfo><MCCMNC>00101</MCCMNC><NetworkName>First</NetworkName>"
@@ -47,18 +47,12 @@ struct SecondSim : zel_test::ServicePhone {
 
 TEST_F(SecondSim, IsNotVerifiedBehindItsInstall) {
     install(ZEL_SVC_INSTALL_CONFIG_MODE);
-    const auto results = std::make_unique<ZelSvcVerificationResult[]>(ZEL_SVC_MAX_RESULTS);
-    std::int32_t count = 0;
-    EXPECT_EQ(zel_svc_config_verification(results.get(), &count), 1);
-    std::vector<std::string> lines;
-    for (const ZelSvcVerificationResult &result : std::span{results.get(), static_cast<std::size_t>(count)}) {
-        EXPECT_EQ(result.passed, 1) << result.text;
-        lines.emplace_back(result.text);
-    }
+    const std::vector<std::string> lines = verified_lines();
     for (const char *line :
-         {"[Spec][MaxPDP1/MaxPDP3G] Spec='3',Phone='3'", "[Spec][FastDormancy1/TimeOut] Spec='5',Phone='5'",
-          "[Spec][Profile1/APN] Spec='internet',Phone='internet'"})
-        EXPECT_THAT(lines, ::testing::Contains(line));
+         {"+[Spec][MaxPDP1/MaxPDP3G] Spec='3',Phone='3'", "+[Spec][FastDormancy1/TimeOut] Spec='5',Phone='5'",
+          "+[Spec][Profile1/APN] Spec='internet',Phone='internet'"})
+        EXPECT_THAT(lines, Contains(line));
+    EXPECT_THAT(lines, Not(Contains(StartsWith("-"))));
 }
 
 TEST_F(SecondSim, IsNotExportedBehindItsUpgrade) {

@@ -1,6 +1,7 @@
 #include "service-phone.h"
 
 #include <algorithm>
+#include <memory>
 #include <sstream>
 
 namespace zel_test {
@@ -70,6 +71,19 @@ bool ServicePhone::system_logged(const std::string &text) {
         if (message.size() >= end.size() && message.compare(message.size() - end.size(), end.size(), end) == 0)
             return true;
     return false;
+}
+
+std::vector<std::string> ServicePhone::verified_lines(std::string_view begin) {
+    const auto results = std::make_unique<ZelSvcVerificationResult[]>(ZEL_SVC_MAX_RESULTS);
+    std::int32_t count = INT32_MIN; // what a caller's variable may hold
+    EXPECT_EQ(zel_svc_config_verification(results.get(), &count), 1);
+    std::vector<std::string> lines;
+    for (std::int32_t i = 0; i < count; ++i) {
+        const ZelSvcVerificationResult &result = results[static_cast<std::size_t>(i)];
+        if (std::string_view{result.text}.starts_with(begin))
+            lines.push_back((result.passed == 1 ? "+" : "-") + std::string{result.text});
+    }
+    return lines;
 }
 
 } // namespace zel_test

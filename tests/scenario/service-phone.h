@@ -6,6 +6,7 @@
 #include <zel-svc.h>
 
 #include <string>
+#include <string_view>
 #include <vector>
 
 namespace zel_test {
@@ -34,6 +35,9 @@ class ServicePhone : public BenchPhone {
     bool logged(const std::string &line);
     // Whether a system-log message ends in "> TEXT".
     bool system_logged(const std::string &text);
+
+    // The lines of a verification that begin so, "+" in front of a passed one and "-" in front of a failed one.
+    static std::vector<std::string> verified_lines(std::string_view begin = "");
 };
 
 } // namespace zel_test

@@ -30,15 +30,6 @@ class VerificationBounds : public zel_test::ServicePhone {
         write_customer("BTU", "<GeneralInfo><CountryISO>" + spec + "</CountryISO></GeneralInfo>");
     }
 
-    std::vector<std::string> verify() {
-        std::int32_t count = INT32_MAX;
-        EXPECT_EQ(zel_svc_config_verification(results_.get(), &count), 1);
-        std::vector<std::string> lines;
-        for (std::int32_t i = 0; i < count; ++i)
-            lines.emplace_back(results_[static_cast<std::size_t>(i)].text);
-        return lines;
-    }
-
     std::unique_ptr<ZelSvcVerificationResult[]> results_ =
         std::make_unique<ZelSvcVerificationResult[]>(ZEL_SVC_MAX_RESULTS);
 };
@@ -51,9 +42,10 @@ TEST_F(VerificationBounds, SpecLineIsCutAtAWholeCharacter) {
     for (int i = 0; i < 200; ++i)
         even += "\xC3\xA9";
     make_differing(even);
-    EXPECT_EQ(verify().at(2), "[Spec][CountryISO] Spec='" + even.substr(0, 280));
+    EXPECT_EQ(verified_lines().at(2), "-[Spec][CountryISO] Spec='" + even.substr(0, 280));
     make_differing("x" + even);
-    EXPECT_EQ(verify().at(2), "[Spec][CountryISO] Spec='x" + even.substr(0, 278)) << "304 bytes, not half a character";
+    EXPECT_EQ(verified_lines().at(2), "-[Spec][CountryISO] Spec='x" + even.substr(0, 278))
+        << "304 bytes, not half a character";
     EXPECT_THAT(read(kReport), HasSubstr("Spec='x" + even.substr(0, 278) + " ==> Failure\n"));
 }
 
@@ -67,9 +59,9 @@ TEST_F(VerificationBounds, ApplicationLineAndItsPartsAreCutAtWholeCharacters) {
     write(std::string{kApp} + "appresult.ini", "[result]\ncount = 2\ndescription_001 = op=x\nresult_001 = success\n"
                                                "description_002 = op=1234567890123456789" +
                                                    name + "\nresult_002 = success\n");
-    const auto lines = verify();
-    EXPECT_EQ(lines.at(1), "[App][Customer1] x" + name.substr(0, 286));
-    EXPECT_EQ(lines.at(2), "[App][Customer2] a(12345678,1234567890123456789)");
+    const auto lines = verified_lines();
+    EXPECT_EQ(lines.at(1), "+[App][Customer1] x" + name.substr(0, 286));
+    EXPECT_EQ(lines.at(2), "+[App][Customer2] a(12345678,1234567890123456789)");
 }
 
 TEST_F(VerificationBounds, AFullEntryIsTerminatedAndTheNextOneUntouched) {
@@ -126,16 +118,25 @@ TEST_F(VerificationBounds, ForImeiCountsEveryKindAndGivesTheFirstOfTheList) {
 TEST_F(VerificationBounds, FiguresOfAnInstallAreReadAsNumbersWhateverStandsThere) {
     make_differing("GB");
     write("/opt/usr/media/Images/a.png", "12345");
-    for (const auto &[entries, size, count] :
-         {std::tuple{"image_size = -5\nimage_count = -1\n", "0", "-1"},
-          {"image_size = 99999999999999999999\nimage_count = 0x10\n", "4294967295", "16"},
-          {"image_size = \"5 bytes\"\nimage_count = one\n", "5", "0"},
-          {"image_size = 0x5\nimage_count = 010\n", "0", "8"},
-          {"image_size =\nimage_count =\n", "0", "0"}}) {
-        write("/opt/system/zel-default/output/zel-fs-status-config.ini", std::string{"[media]\n"} + entries);
-        const auto lines = verify();
-        EXPECT_EQ(lines.at(8), std::string{"[FS] media/image size "} + size + "=>5") << entries;
-        EXPECT_EQ(lines.at(9), std::string{"[FS] media/image count "} + count + "=>1") << entries;
+    struct Figures {
+        const char *entries;
+        const char *size;
+        const char *count;
+    };
+    for (const Figures &figures : {Figures{"image_size = -5\nimage_count = -1\n", "-0", "--1"},
+                                   {"image_size = 99999999999999999999\nimage_count = 0x10\n", "-4294967295", "-16"},
+                                   {"image_size = \"5 bytes\"\nimage_count = one\n", "+5", "-0"},
+                                   {"image_size = 0x5\nimage_count = 01\n", "-0", "+1"},
+                                   {"image_size = +5\nimage_count = 010\n", "+5", "-8"},
+                                   {"image_size =\nimage_count =\n", "-0", "-0"}}) {
+        write("/opt/system/zel-default/output/zel-fs-status-config.ini", std::string{"[media]\n"} + figures.entries);
+        const auto line = [](char passed, const std::string &what, const std::string &now) {
+            return passed + ("[FS] media/image " + what) + "=>" + now;
+        };
+        EXPECT_THAT(verified_lines("[FS] media/image"),
+                    ElementsAre(line(*figures.size, std::string{"size "} + (figures.size + 1), "5"),
+                                line(*figures.count, std::string{"count "} + (figures.count + 1), "1")))
+            << figures.entries;
     }
 }
 
@@ -153,7 +154,7 @@ TEST_F(VerificationBounds, CountsOfApplicationsInStrangeForms) {
                                           {"-1", 0U},
                                           {"1000", 999U}}) {
         write(std::string{kApp} + "appresult.ini", std::string{"[result]\ncount = "} + count + "\n");
-        EXPECT_EQ(verify().size(), 1 + expected) << count;
+        EXPECT_EQ(verified_lines().size(), 1 + expected) << count;
     }
 }
 
@@ -164,9 +165,9 @@ TEST_F(VerificationBounds, SectionsInTheNameOfAnEntryAreNone) {
     write(std::string{kApp} + "appresult.ini",
           "[result:result_001]\n[result:description_002]\n[result]\ncount = 2\ndescription_001 = op=x\n"
           "result_002 = success\n");
-    EXPECT_THAT(verify(),
-                ElementsAre("[App][Default] App NOT existed.", "[App][Customer1] unknown(tpk,x),Result unknown",
-                            "[App][Customer2] File unknown"));
+    EXPECT_THAT(verified_lines(),
+                ElementsAre("+[App][Default] App NOT existed.", "-[App][Customer1] unknown(tpk,x),Result unknown",
+                            "+[App][Customer2] File unknown"));
 }
 
 // The INI library reads a folder as it reads an empty file.
@@ -176,10 +177,10 @@ TEST_F(VerificationBounds, FoldersInTheNameOfAFileHoldNothing) {
         write(std::string{kApp} + name, "");
     write(std::string{kApp} + "appresult_def.ini", "[result]\ncount = 1\ndescription_001 = op=x\nresult_001 = fail\n");
     write("/opt/system/zel-default/output/zel-fs-status-config.ini/x", "");
-    const auto lines = verify();
+    const auto lines = verified_lines();
     ASSERT_EQ(lines.size(), 21U);
-    EXPECT_EQ(lines.at(0), "[FS] media/wallpaper size 0=>0");
-    EXPECT_EQ(lines.at(20), "[App][Default1] unknown(unknown,x),fail");
+    EXPECT_EQ(lines.at(0), "+[FS] media/wallpaper size 0=>0");
+    EXPECT_EQ(lines.at(20), "-[App][Default1] unknown(unknown,x),fail");
 }
 
 TEST_F(VerificationBounds, OperationEndsAtTheFirstOfItsEnds) {
@@ -190,18 +191,18 @@ TEST_F(VerificationBounds, OperationEndsAtTheFirstOfItsEnds) {
                                                "description_002 = stop=now op=install\nresult_002 = success\n"
                                                "description_003 = op=\nresult_003 = success\n"
                                                "description_004 = op=op=x\nresult_004 = success\n");
-    const auto lines = verify();
-    EXPECT_EQ(lines.at(1), "[App][Customer1] a(unknown,)");
-    EXPECT_EQ(lines.at(2), "[App][Customer2] b(unknown,now op=install)") << "the first \"op=\", wherever it stands";
-    EXPECT_EQ(lines.at(3), "[App][Customer3] c(unknown,)");
-    EXPECT_EQ(lines.at(4), "[App][Customer4] (unknown,op=x)") << "an empty name is a name";
+    const auto lines = verified_lines();
+    EXPECT_EQ(lines.at(1), "+[App][Customer1] a(unknown,)");
+    EXPECT_EQ(lines.at(2), "+[App][Customer2] b(unknown,now op=install)") << "the first \"op=\", wherever it stands";
+    EXPECT_EQ(lines.at(3), "+[App][Customer3] c(unknown,)");
+    EXPECT_EQ(lines.at(4), "+[App][Customer4] (unknown,op=x)") << "an empty name is a name";
 }
 
 TEST_F(VerificationBounds, ReportReplacesALinkAndLeavesWhatItNames) {
     make_differing("GB");
     write("/opt/system/elsewhere", "kept");
     ASSERT_EQ(::symlink("/opt/system/elsewhere", (root() + kReport).c_str()), 0);
-    verify();
+    verified_lines();
     EXPECT_EQ(read("/opt/system/elsewhere"), "kept");
     EXPECT_THAT(read(kReport), StartsWith("ZEL Version : "));
 }

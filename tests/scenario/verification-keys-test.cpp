@@ -4,7 +4,6 @@
 
 #include <gmock/gmock.h>
 
-#include <memory>
 #include <set>
 #include <variant>
 
@@ -188,24 +187,17 @@ class VerificationOfKeys : public zel_test::ServicePhone {
         set_string(key, std::get<std::string>(value));
     }
 
-    // The lines of the customer's file, without "[Spec]"; the failed ones only.
+    // The failed lines of the customer's file, without "-[Spec]".
     std::vector<std::string> failures() {
-        std::int32_t count = 0;
-        EXPECT_EQ(zel_svc_config_verification(results_.get(), &count), 1);
-        std::vector<std::string> lines;
-        compared_ = 0;
-        for (std::int32_t i = 0; i < count; ++i) {
-            const std::string line = results_[static_cast<std::size_t>(i)].text;
-            if (line.rfind("[Spec]", 0) != 0) continue;
-            ++compared_;
-            if (results_[static_cast<std::size_t>(i)].passed == 0) lines.push_back(line.substr(6));
-        }
-        return lines;
+        std::vector<std::string> failed;
+        const std::vector<std::string> lines = verified_lines("[Spec]");
+        for (const std::string &line : lines)
+            if (line.front() == '-') failed.push_back(line.substr(std::string_view{"-[Spec]"}.size()));
+        compared_ = lines.size();
+        return failed;
     }
 
-    int compared_ = 0;
-    std::unique_ptr<ZelSvcVerificationResult[]> results_ =
-        std::make_unique<ZelSvcVerificationResult[]>(ZEL_SVC_MAX_RESULTS);
+    std::size_t compared_ = 0;
 };
 
 } // namespace
@@ -215,7 +207,7 @@ TEST_F(VerificationOfKeys, EachFailsItsOwnLines) {
     write_customer("BTU", kFile);
     zel_svc_config_install_customer("BTU", ZEL_SVC_INSTALL_CONFIG_MODE);
     EXPECT_THAT(failures(), IsEmpty());
-    const int all = compared_;
+    const std::size_t all = compared_;
     std::set<std::string> failed; // "[GPS/GPSActivation]"
     for (const KeyLines &row : key_lines()) {
         const Value before = value_of(row);
@@ -227,5 +219,5 @@ TEST_F(VerificationOfKeys, EachFailsItsOwnLines) {
             failed.insert(line.substr(0, line.find(' ')));
     }
     EXPECT_THAT(failures(), IsEmpty());
-    EXPECT_EQ(failed.size(), static_cast<std::size_t>(all) - 1) << "every line but that of the sales code";
+    EXPECT_EQ(failed.size(), all - 1) << "every line but that of the sales code";
 }

@@ -5,8 +5,6 @@
 
 #include <gmock/gmock.h>
 
-#include <memory>
-
 namespace {
 
 using ::testing::ElementsAre;
@@ -43,55 +41,42 @@ class VerifyConnections : public zel_test::ServicePhone {
         ASSERT_NE(place, std::string::npos) << group << " has no " << from;
         write(data_path(group), text.replace(place, from.size(), to));
     }
-
-    // Lines of a verification whose text begins so, "+" in front of a passed one and "-" of a failed one.
-    static std::vector<std::string> lines(std::string_view begin) {
-        const auto results = std::make_unique<ZelSvcVerificationResult[]>(ZEL_SVC_MAX_RESULTS);
-        int count = 0;
-        EXPECT_EQ(zel_svc_config_verification(results.get(), &count), 1);
-        std::vector<std::string> found;
-        for (int i = 0; i < count; ++i) {
-            const ZelSvcVerificationResult &result = results[static_cast<std::size_t>(i)];
-            if (std::string_view{result.text}.starts_with(begin))
-                found.push_back((result.passed == 1 ? "+" : "-") + std::string{result.text});
-        }
-        return found;
-    }
 };
 
 } // namespace
 
 TEST_F(VerifyConnections, HandlesHaveLinesOnlyForANetworkWithoutMccAndMnc) {
     for (const char *service : {"Browser]", "MMS]", "IntSharing]", "IMS]", "XCAP]", "Emergency"})
-        EXPECT_THAT(lines(std::string{"[Spec][Prof"} + service), IsEmpty());
+        EXPECT_THAT(verified_lines(std::string{"[Spec][Prof"} + service), IsEmpty());
 
     run("insert into network_info values(9, 'North', '')");
     const std::string columns = "insert into pdp_profile(profile_id, profile_name, network_info_id, svc_category_id, "
                                 "default_internet_con) values";
     run(columns + "(91, 'Web', 9, 1, 1), (92, 'MMS', 9, 2, 1), (93, 'Share', 9, 5, 1), (94, 'IMS', 9, 0, 1), "
                   "(95, 'XCAP', 9, 7, 1), (96, 'SOS', 9, 6, 1)");
-    EXPECT_THAT(lines("[Spec][ProfBrowser]"), ElementsAre("+[Spec][ProfBrowser] Spec='Web',Phone='Web'"));
-    EXPECT_THAT(lines("[Spec][ProfMMS]"), ElementsAre("+[Spec][ProfMMS] Spec='MMS',Phone='MMS'"));
-    EXPECT_THAT(lines("[Spec][ProfIntSharing]"), ElementsAre("+[Spec][ProfIntSharing] Spec='Share',Phone='Share'"));
-    EXPECT_THAT(lines("[Spec][ProfIMS]"), ElementsAre("+[Spec][ProfIMS] Spec='IMS',Phone='IMS'"));
-    EXPECT_THAT(lines("[Spec][ProfXCAP]"), ElementsAre("+[Spec][ProfXCAP] Spec='XCAP',Phone='XCAP'"));
-    EXPECT_THAT(lines("[Spec][ProfEmergencyImsCall]"),
+    EXPECT_THAT(verified_lines("[Spec][ProfBrowser]"), ElementsAre("+[Spec][ProfBrowser] Spec='Web',Phone='Web'"));
+    EXPECT_THAT(verified_lines("[Spec][ProfMMS]"), ElementsAre("+[Spec][ProfMMS] Spec='MMS',Phone='MMS'"));
+    EXPECT_THAT(verified_lines("[Spec][ProfIntSharing]"),
+                ElementsAre("+[Spec][ProfIntSharing] Spec='Share',Phone='Share'"));
+    EXPECT_THAT(verified_lines("[Spec][ProfIMS]"), ElementsAre("+[Spec][ProfIMS] Spec='IMS',Phone='IMS'"));
+    EXPECT_THAT(verified_lines("[Spec][ProfXCAP]"), ElementsAre("+[Spec][ProfXCAP] Spec='XCAP',Phone='XCAP'"));
+    EXPECT_THAT(verified_lines("[Spec][ProfEmergencyImsCall]"),
                 ElementsAre("+[Spec][ProfEmergencyImsCall] Spec='SOS',Phone='SOS'"));
 
     // Only a profile that is the default of its category serves it.
     run("update pdp_profile set default_internet_con=0 where profile_id in (91, 96)");
     run("update pdp_profile set profile_name='Other' where profile_id=94");
-    EXPECT_THAT(lines("[Spec][ProfBrowser]"), ElementsAre("-[Spec][ProfBrowser] Spec='Web',Phone=''"));
-    EXPECT_THAT(lines("[Spec][ProfIMS]"), ElementsAre("-[Spec][ProfIMS] Spec='IMS',Phone='Other'"));
-    EXPECT_THAT(lines("[Spec][ProfMMS]"), ElementsAre("+[Spec][ProfMMS] Spec='MMS',Phone='MMS'"));
-    EXPECT_THAT(lines("[Spec][ProfEmergencyImsCall]"),
+    EXPECT_THAT(verified_lines("[Spec][ProfBrowser]"), ElementsAre("-[Spec][ProfBrowser] Spec='Web',Phone=''"));
+    EXPECT_THAT(verified_lines("[Spec][ProfIMS]"), ElementsAre("-[Spec][ProfIMS] Spec='IMS',Phone='Other'"));
+    EXPECT_THAT(verified_lines("[Spec][ProfMMS]"), ElementsAre("+[Spec][ProfMMS] Spec='MMS',Phone='MMS'"));
+    EXPECT_THAT(verified_lines("[Spec][ProfEmergencyImsCall]"),
                 ElementsAre("-[Spec][ProfEmergencyImsCall] Spec='SOS',Phone=''"));
 }
 
 TEST_F(VerifyConnections, ProfileIsComparedWithItsRow) {
     run("update pdp_profile set profile_name='Net', auth_type=2, apn='own', is_static_ip_addr=1, dns_addr2='10.0.0.1'");
     EXPECT_THAT(
-        lines("[Spec][Profile1"),
+        verified_lines("[Spec][Profile1"),
         ElementsAre(
             "-[Spec][Profile1/ProfileName] Spec='Web',Phone='Net'", "-[Spec][Profile1/Auth] Spec='',Phone='secure'",
             "+[Spec][Profile1/UserId] Spec='',Phone=''", "+[Spec][Profile1/Password] Spec='',Phone=''",
@@ -107,23 +92,25 @@ TEST_F(VerifyConnections, ProfileIsComparedWithItsRow) {
 TEST_F(VerifyConnections, DormancyAndLimitsAreComparedWithTheirRecords) {
     run("delete from fast_dormancy");
     run("delete from max_pdp");
-    EXPECT_THAT(lines("[Spec][FastDormancy"), ElementsAre("+[Spec][FastDormancy/NbFastDormancy] Spec='1',Phone='1'",
-                                                          "+[Spec][FastDormancy1/EnableStatus] Spec='on',Phone='on'",
-                                                          "+[Spec][FastDormancy1/LCDStatus] Spec='on',Phone='on'",
-                                                          "+[Spec][FastDormancy1/TimeOut] Spec='2.5',Phone='2.5'",
-                                                          "+[Spec][FastDormancy1/Version] Spec='rel8',Phone='rel8'"));
-    EXPECT_THAT(lines("[Spec][MaxPDP"), ElementsAre("+[Spec][MaxPDP1/MaxPDP2G] Spec='1',Phone='1'",
-                                                    "+[Spec][MaxPDP1/MaxPDP3G] Spec='2',Phone='2'"));
+    EXPECT_THAT(verified_lines("[Spec][FastDormancy"),
+                ElementsAre("+[Spec][FastDormancy/NbFastDormancy] Spec='1',Phone='1'",
+                            "+[Spec][FastDormancy1/EnableStatus] Spec='on',Phone='on'",
+                            "+[Spec][FastDormancy1/LCDStatus] Spec='on',Phone='on'",
+                            "+[Spec][FastDormancy1/TimeOut] Spec='2.5',Phone='2.5'",
+                            "+[Spec][FastDormancy1/Version] Spec='rel8',Phone='rel8'"));
+    EXPECT_THAT(verified_lines("[Spec][MaxPDP"), ElementsAre("+[Spec][MaxPDP1/MaxPDP2G] Spec='1',Phone='1'",
+                                                             "+[Spec][MaxPDP1/MaxPDP3G] Spec='2',Phone='2'"));
 
     replace_in("fast-dormancy", "enable_1                       = 1", "enable_1 = 0");
     replace_in("fast-dormancy", "time_out_1", "time_out_8");
     replace_in("max-pdp", "max_pdp_2g_1                   = 1", "max_pdp_2g_1 = 4");
     replace_in("max-pdp", "max_pdp_3g_1", "max_pdp_3g_8");
-    EXPECT_THAT(lines("[Spec][FastDormancy"), ElementsAre("+[Spec][FastDormancy/NbFastDormancy] Spec='1',Phone='1'",
-                                                          "-[Spec][FastDormancy1/EnableStatus] Spec='on',Phone='off'",
-                                                          "+[Spec][FastDormancy1/LCDStatus] Spec='on',Phone='on'",
-                                                          "-[Spec][FastDormancy1/TimeOut] Spec='2.5',Phone=''",
-                                                          "+[Spec][FastDormancy1/Version] Spec='rel8',Phone='rel8'"));
-    EXPECT_THAT(lines("[Spec][MaxPDP"), ElementsAre("-[Spec][MaxPDP1/MaxPDP2G] Spec='1',Phone='4'",
-                                                    "-[Spec][MaxPDP1/MaxPDP3G] Spec='2',Phone=''"));
+    EXPECT_THAT(verified_lines("[Spec][FastDormancy"),
+                ElementsAre("+[Spec][FastDormancy/NbFastDormancy] Spec='1',Phone='1'",
+                            "-[Spec][FastDormancy1/EnableStatus] Spec='on',Phone='off'",
+                            "+[Spec][FastDormancy1/LCDStatus] Spec='on',Phone='on'",
+                            "-[Spec][FastDormancy1/TimeOut] Spec='2.5',Phone=''",
+                            "+[Spec][FastDormancy1/Version] Spec='rel8',Phone='rel8'"));
+    EXPECT_THAT(verified_lines("[Spec][MaxPDP"), ElementsAre("-[Spec][MaxPDP1/MaxPDP2G] Spec='1',Phone='4'",
+                                                             "-[Spec][MaxPDP1/MaxPDP3G] Spec='2',Phone=''"));
 }
