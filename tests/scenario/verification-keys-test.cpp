@@ -4,6 +4,7 @@
 
 #include <gmock/gmock.h>
 
+#include <map>
 #include <set>
 #include <variant>
 
@@ -176,6 +177,13 @@ const std::vector<KeyLines> &key_lines() {
 
 class VerificationOfKeys : public zel_test::ServicePhone {
   protected:
+    void SetUp() override {
+        ServicePhone::SetUp();
+        set_string("db/zel/salescode", "BTU");
+        write_customer("BTU", kFile);
+        zel_svc_config_install_customer("BTU", ZEL_SVC_INSTALL_CONFIG_MODE);
+    }
+
     Value value_of(const KeyLines &row) {
         if (std::holds_alternative<int>(row.another)) return get_int(row.key).value();
         if (std::holds_alternative<bool>(row.another)) return get_bool(row.key).value();
@@ -203,9 +211,6 @@ class VerificationOfKeys : public zel_test::ServicePhone {
 } // namespace
 
 TEST_F(VerificationOfKeys, EachFailsItsOwnLines) {
-    set_string("db/zel/salescode", "BTU");
-    write_customer("BTU", kFile);
-    zel_svc_config_install_customer("BTU", ZEL_SVC_INSTALL_CONFIG_MODE);
     EXPECT_THAT(failures(), IsEmpty());
     const std::size_t all = compared_;
     std::set<std::string> failed; // "[GPS/GPSActivation]"
@@ -220,4 +225,25 @@ TEST_F(VerificationOfKeys, EachFailsItsOwnLines) {
     }
     EXPECT_THAT(failures(), IsEmpty());
     EXPECT_EQ(failed.size(), all - 1) << "every line but that of the sales code";
+}
+
+// Whatever a key says: a document that the phone wrote itself is met by it, but for the earphone's own level,
+// which no document can tell.
+TEST_F(VerificationOfKeys, MeetsWhatThePhonesOwnExportSays) {
+    const std::map<std::string_view, std::string> levels = {
+        {"db/private/sound/volume/ringtone", "[RngVolume] Spec='11',Phone='(Speaker)11,(Earphone)3'"},
+        {"db/private/sound/volume/notification", "[MsgToneVolume] Spec='1',Phone='(Speaker)1,(Earphone)9'"},
+    };
+    for (const KeyLines &row : key_lines()) {
+        const Value before = value_of(row);
+        set(row.key, row.another);
+        ASSERT_EQ(zel_svc_config_encoding_xml(), 1);
+        write("/opt/system/zel/mps/ZEL/Customer/BTU/customer.xml",
+              read("/opt/system/zel-default/output/customer-phone.xml"));
+        const auto level = levels.find(row.key);
+        const std::vector<std::string> failed = failures();
+        EXPECT_EQ(failed, level == levels.end() ? std::vector<std::string>{} : std::vector{level->second}) << row.key;
+        EXPECT_GT(compared_, 40U) << row.key;
+        set(row.key, before);
+    }
 }
