@@ -209,6 +209,19 @@ TEST_F(ConnectionExport, MissingProfileIsEmptyAndNotHalfOfOne) {
     EXPECT_EQ(open_databases(), 0U);
 }
 
+// What is not recorded reads as -1.
+TEST_F(ConnectionExport, RowOfANegativeIdIsNoProfile) {
+    run("insert into pdp_profile(profile_id, profile_name) values(-1, 'Ghost'), (-7, 'Ghost')");
+    zel_svc_data_unset(ZEL_SVC_DATA_CONNECTION, "spec", "profile_id_1");
+    begin_export();
+    EXPECT_THAT(export_profile(), Each(StrEq("")));
+    for (const int id : {-1, -7}) {
+        zel_svc_data_set_int(ZEL_SVC_DATA_CONNECTION, "spec", "profile_id_1", id);
+        begin_export();
+        EXPECT_THAT(export_profile(), Each(StrEq(""))) << id;
+    }
+}
+
 TEST_F(ConnectionExport, CountIsThatOfTheSpecsProfiles) {
     EXPECT_EQ(export_value(ZEL_SVC_ELEMENT_NB_PROFILE), "0");
     for (const int count : {3, 0, -1, 10001}) {

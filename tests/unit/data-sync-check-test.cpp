@@ -145,6 +145,7 @@ TEST_F(CheckedDataSync, OutsideOfSyncMlNothingCanBeRead) {
                 ElementsAre(failed("[SyncML_DS/NbDataSync] Spec='2',Phone='?\?'"),
                             failed("[SyncML_DS1] Reading phone failed")));
     EXPECT_EQ(calls_of("sync_agent_ds_init"), 0);
+    EXPECT_EQ(calls_of("sync_agent_ds_get_all_profile"), 0) << "an agent that is not in use is not asked";
 }
 
 TEST_F(CheckedDataSync, LongEnableTextIsShownCut) {
@@ -189,6 +190,7 @@ TEST_F(CheckedDataSync, WithoutAgentTheCountIsUnknownAndEachAccountFails) {
                             failed("[SyncML_DS1] Reading phone failed"), failed("[SyncML_DS2] Reading phone failed")));
     EXPECT_EQ(run_log(), "[SyncML_DS/Error] sync_agent_ds_init() failed.\n");
     EXPECT_EQ(calls_of("sync_agent_ds_deinit"), 0);
+    EXPECT_EQ(calls_of("sync_agent_ds_get_all_profile"), 0);
 }
 
 TEST_F(CheckedDataSync, FailsWhereTheAgentCannotBeAsked) {
@@ -238,6 +240,7 @@ TEST_F(CheckedDataSync, CountIsExportedAsUnknownWithoutAgentOrList) {
     EXPECT_EQ(export_value(ZEL_SVC_ELEMENT_NB_DATA_SYNC), "??");
     EXPECT_EQ(exported_account(), kNothing);
     export_end(ZEL_SVC_ELEMENT_SYNCML);
+    EXPECT_EQ(calls_of("sync_agent_ds_get_all_profile"), 1) << "the one of the agent that was in use";
 }
 
 TEST_F(CheckedDataSync, EveryListOfTheAgentIsReleasedAndEveryProfileToo) {
