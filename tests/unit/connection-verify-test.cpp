@@ -92,6 +92,7 @@ const std::vector<ExpectedLine> kLines{
     {"proxy_ip_addr='10.0.0.1:81'", proxy("10.0.0.1", "80"), failed("[Profile1/Proxy/Port] Spec='80',Phone='81'")},
     {"proxy_ip_addr='10.0.0.1:080'", proxy("10.0.0.1", "80"), failed("[Profile1/Proxy/Port] Spec='80',Phone='080'")},
     {"proxy_ip_addr='10.0.0.1'", proxy("10.0.0.1", "0"), passed("[Profile1/Proxy/Port] Spec='0',Phone=''")},
+    {"proxy_ip_addr='10.0.0.1:80'", proxy("10.0.0.1", "0"), failed("[Profile1/Proxy/Port] Spec='0',Phone='80'")},
     {"proxy_ip_addr='10.0.0.1'", proxy("10.0.0.1", ""), passed("[Profile1/Proxy/Port] Spec='',Phone=''")},
     {"proxy_ip_addr='10.0.0.1'", proxy("10.0.0.1", "80"), failed("[Profile1/Proxy/Port] Spec='80',Phone=''")},
     {"proxy_ip_addr='10.0.0.1:80'", proxy("10.0.0.1", ""), failed("[Profile1/Proxy/Port] Spec='',Phone='80'")},
