@@ -14,9 +14,10 @@ std::string_view text_of(const ZelSvcVerificationResult &entry) {
 }
 
 std::string head(const ZelSvcVerifiedPhone &phone) {
+    const ZelSvcCurrentCustomer &customer = phone.customer;
     std::string text{"ZEL Version : "};
-    text.append(phone.package_version.view()).append("\nSales code : ").append(phone.sales_code.view());
-    if (!phone.internal_name.empty()) text.append("(internal:").append(phone.internal_name.view()).append(")");
+    text.append(phone.package_version.view()).append("\nSales code : ").append(customer.code.view());
+    if (customer.shares_folder) text.append("(internal:").append(customer.folder.view()).append(")");
     return text + '\n';
 }
 

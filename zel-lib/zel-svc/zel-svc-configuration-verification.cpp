@@ -2,7 +2,6 @@
 
 #include "zel-svc-configuration-verification.h"
 
-#include "base/zel-svc-active-customer.h"
 #include "base/zel-svc-guard.h"
 #include "base/zel-svc-text.h"
 #include "spec/zel-svc-verification.h"
@@ -12,39 +11,22 @@
 
 namespace {
 
-using SalesCode = FixedText<ZEL_SVC_SALES_CODE_SIZE>;
-constexpr int kCodeSize = SalesCode::width;
-
-// Empty without an active customer.
-SalesCode active_customer() {
-    SalesCode code;
-    zel_svc_config_get_active_customer_name(code.data(), kCodeSize);
-    return code;
-}
-
-struct Verified {
+ZelSvcVerifiedPhone who_is_verified() {
     ZelSvcVerifiedPhone phone;
-    SalesCode folder; // of the customer's file
-};
-
-Verified who_is_verified() {
-    Verified verified;
-    auto &[version, code, internal_name] = verified.phone;
-    code = active_customer();
-    const int differs = zel_svc_config_get_internal_customer_name(code.c_str(), verified.folder.data(), kCodeSize);
-    if (differs == 1) internal_name = verified.folder;
+    phone.customer = zel_svc_current_customer();
+    auto &version = phone.package_version;
     zel_svc_config_get_zel_bin_version(version.data(), static_cast<int>(version.width));
-    return verified;
+    return phone;
 }
 
 // Each part goes on where another one ran out of memory.
 int verify(ZelSvcResultList &list) {
-    const Verified verified = who_is_verified();
+    const ZelSvcVerifiedPhone phone = who_is_verified();
     zel_svc_guarded([&] { zel_svc_config_verify_media(list); });
     zel_svc_guarded([&] { zel_svc_config_verify_applications(list); });
     int failed = 0;
-    zel_svc_guarded([&] { failed = zel_svc_config_verify_spec(verified.folder.view(), list); });
-    return zel_svc_config_write_report(verified.phone, list, failed) ? 1 : 0;
+    zel_svc_guarded([&] { failed = zel_svc_config_verify_spec(phone.customer.folder.view(), list); });
+    return zel_svc_config_write_report(phone, list, failed) ? 1 : 0;
 }
 
 // Of the one verification that runs at a time: too large for a caller's stack.
@@ -80,7 +62,7 @@ int zel_svc_config_verification(ZelSvcVerificationResult *results, int32_t *coun
 
 int zel_svc_config_verification_for_imei(char *buffer, int size) {
     const std::size_t room = buffer ? zel_svc_buffer_size(size) : 0;
-    if (active_customer().empty()) {
+    if (zel_svc_current_customer().code.empty()) {
         zel_svc_text_copy(buffer, room, "Pre-configuration not found!");
         return 1;
     }

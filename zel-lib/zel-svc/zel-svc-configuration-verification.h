@@ -1,7 +1,7 @@
 #pragma once
 // The parts of a verification, in the order in which it has them. Each adds its lines to one list.
 
-#include "base/zel-svc-active-customer.h"
+#include "base/zel-svc-internal-customer.h"
 #include "base/zel-svc-text.h"
 #include "zel-svc.h"
 
@@ -41,8 +41,7 @@ int zel_svc_config_verify_spec(std::string_view customer, ZelSvcResultList &list
 // Who was verified, as the report's head tells.
 struct ZelSvcVerifiedPhone {
     FixedText<20> package_version;
-    FixedText<ZEL_SVC_SALES_CODE_SIZE> sales_code;
-    FixedText<ZEL_SVC_SALES_CODE_SIZE> internal_name; // empty when it is the sales code
+    ZelSvcCurrentCustomer customer;
 };
 
 inline constexpr const char *ZEL_SVC_REPORT_PATH = "/opt/system/zel-default/output/zel-verification-report.log";
