@@ -64,6 +64,27 @@ TEST_F(VerificationBounds, ApplicationLineAndItsPartsAreCutAtWholeCharacters) {
     EXPECT_EQ(lines.at(2), "+[App][Customer2] a(12345678,1234567890123456789)");
 }
 
+TEST_F(VerificationBounds, HeadHasNineBytesOfTheCodeAndOfEachPartOfTheVersion) {
+    set_string("db/private/zel/bin_name", "NAME56789-and-more");
+    set_string("db/private/zel/bin_version", "VERS56789-and-more");
+    set_string("db/zel/salescode", "CODE56789-and-more");
+    write_customer("CODE56789", "<GeneralInfo><SalesCode>CODE56789</SalesCode></GeneralInfo>");
+    EXPECT_THAT(verified_lines("[Spec]"), ElementsAre("+[Spec][SalesCode] Spec='CODE56789',Phone='CODE56789'"));
+    EXPECT_THAT(read(kReport), StartsWith("ZEL Version : NAME56789VERS56789\nSales code : CODE56789\n---"));
+}
+
+TEST_F(VerificationBounds, CodesThatNameNoFolderCompareNoFile) {
+    write_spec("/opt/system/zel/mps/ZEL/Customer/customer.xml", "<CountryISO>FR</CountryISO>");
+    write_spec("/opt/system/zel/mps/ZEL/customer.xml", "<CountryISO>FR</CountryISO>");
+    write_customer("a/b", "<CountryISO>FR</CountryISO>");
+    for (const std::string code : {".", "..", "a/b", "/", "DEF"}) {
+        set_string("db/zel/salescode", code);
+        EXPECT_THAT(verified_lines("[Spec]"), ::testing::IsEmpty()) << code;
+        EXPECT_THAT(read(kReport), HasSubstr("\nSales code : " + (code == "DEF" ? "" : code) + "\n---")) << code;
+        EXPECT_THAT(read(kReport), HasSubstr("\nVerification Result : OK!\n")) << code;
+    }
+}
+
 TEST_F(VerificationBounds, AFullEntryIsTerminatedAndTheNextOneUntouched) {
     make_differing(std::string(400, 'x'));
     std::int32_t count = -7;
