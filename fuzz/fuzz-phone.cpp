@@ -4,6 +4,7 @@
 #include "support/temporary-folder.h"
 #include "zel-svc.h"
 
+#include <iniparser/iniparser.h>
 #include <vconf.h>
 #include <zel-host.h>
 
@@ -88,6 +89,9 @@ void verify() {
     require(std::memchr(line.data(), '\0', 20) != nullptr && line[20] == 'x');
 }
 
+// Each broken INI file would be told on standard error.
+int be_silent(const char * /*format*/, ...) { return 0; }
+
 // Read to its end by the reader of spec files.
 bool is_read(std::string_view document) {
     const ZelSvcXmlCallbacks callbacks{};
@@ -123,6 +127,7 @@ extern "C" int LLVMFuzzerInitialize(int * /*count*/, char *** /*arguments*/) {
         write(file.path, file.before);
     }
     require(vconf_set_str("db/zel/salescode", "FUZ") == 0);
+    iniparser_set_error_callback(be_silent);
     return 0;
 }
 
