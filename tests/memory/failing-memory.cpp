@@ -3,12 +3,12 @@
 #include <cstddef>
 #include <cstdint>
 #include <cstdlib>
-#include <execinfo.h>
 #include <link.h>
 #include <map>
 #include <new>
 #include <set>
 #include <string_view>
+#include <unwind.h>
 #include <utility>
 
 // The allocator behind this program's: a sanitizer's where there is one, else the C library's.
@@ -72,10 +72,16 @@ int find_all_code(dl_phdr_info *object, std::size_t /*size*/, void * /*unused*/)
     return 0;
 }
 
+// Not backtrace(): what that loads looks like a leak behind an allocator of our own.
 std::vector<void *> callers() {
-    void *found[64];
-    const int count = ::backtrace(found, 64);
-    return std::vector<void *>(found, found + count);
+    std::vector<void *> found;
+    const auto take = [](_Unwind_Context *frame, void *to) {
+        // The address stands behind the call.
+        static_cast<std::vector<void *> *>(to)->push_back(reinterpret_cast<void *>(_Unwind_GetIP(frame) - 1));
+        return _URC_NO_REASON;
+    };
+    _Unwind_Backtrace(take, &found);
+    return found;
 }
 
 // By the innermost caller that is one of the known libraries.
@@ -119,7 +125,6 @@ void *given_or_thrown(std::size_t size) {
 
 void watched(const std::function<void()> &work) {
     if (!gLibrary.to) ::dl_iterate_phdr(find_all_code, nullptr);
-    callers(); // loads what it needs
     gWatch.on = true;
     work();
     gWatch.on = false;
