@@ -1,12 +1,12 @@
 // The guide for operator engineers shows what the command really prints.
 
 #include "program.h"
+#include "support/lines.h"
 #include "support/source-dir.h"
 
 #include <fstream>
 #include <iterator>
 #include <regex>
-#include <sstream>
 
 using namespace zel_test;
 
@@ -39,14 +39,6 @@ std::vector<std::string> words_of(const std::string &command) {
     for (std::sregex_iterator at{command.begin(), command.end(), word}, end; at != end; ++at)
         words.push_back((*at)[1].matched ? (*at)[1].str() : (*at)[2].str());
     return words;
-}
-
-std::vector<std::string> lines_of(const std::string &text) {
-    std::istringstream stream{text};
-    std::vector<std::string> lines;
-    for (std::string line; std::getline(stream, line);)
-        lines.push_back(line);
-    return lines;
 }
 
 // Whether the lines are those, "..." standing for any number of lines.

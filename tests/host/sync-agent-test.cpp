@@ -21,6 +21,24 @@ struct SyncAgent : zel_test::BenchPhone {
         return profile;
     }
 
+    // By every call that reads or fills a profile.
+    static void expect_refused(Profile *profile) {
+        const char *name = nullptr;
+        GList *list = nullptr;
+        sync_agent_ds_server_info server{.address = "", .user_id = "", .password = ""};
+        const sync_agent_ds_service_info service{};
+        EXPECT_NE(sync_agent_ds_get_profile_name(profile, &name), 0);
+        EXPECT_NE(sync_agent_ds_get_server_info(profile, &server), 0);
+        EXPECT_NE(sync_agent_ds_get_sync_service_info(profile, &list), 0);
+        EXPECT_NE(sync_agent_ds_set_profile_name(profile, "x"), 0);
+        EXPECT_NE(sync_agent_ds_set_profile_attribute(profile, 1), 0);
+        EXPECT_NE(sync_agent_ds_set_server_info(profile, &server), 0);
+        EXPECT_NE(sync_agent_ds_set_sync_info(profile, 0, 0, 1), 0);
+        EXPECT_NE(sync_agent_ds_set_sync_service_info(profile, &service), 0);
+        EXPECT_EQ(name, nullptr);
+        EXPECT_EQ(list, nullptr);
+    }
+
     static void free_all(GList *profiles) {
         for (guint i = 0; i < g_list_length(profiles); ++i)
             EXPECT_EQ(sync_agent_ds_free_profile_info(static_cast<Profile *>(g_list_nth_data(profiles, i))), 0);
@@ -126,19 +144,9 @@ TEST_F(SyncAgent, ServesItsClientsOnly) {
     ASSERT_EQ(sync_agent_ds_init(), 0);
     Profile *profile = new_profile("Work");
     EXPECT_EQ(sync_agent_ds_deinit(), 0);
-    const char *name = nullptr;
     GList *list = nullptr;
-    sync_agent_ds_server_info server{.address = "", .user_id = "", .password = ""};
-    const sync_agent_ds_service_info service{};
     EXPECT_NE(sync_agent_ds_get_all_profile(&list), 0);
-    EXPECT_NE(sync_agent_ds_get_profile_name(profile, &name), 0);
-    EXPECT_NE(sync_agent_ds_get_server_info(profile, &server), 0);
-    EXPECT_NE(sync_agent_ds_get_sync_service_info(profile, &list), 0);
-    EXPECT_NE(sync_agent_ds_set_profile_name(profile, "x"), 0);
-    EXPECT_NE(sync_agent_ds_set_profile_attribute(profile, 1), 0);
-    EXPECT_NE(sync_agent_ds_set_server_info(profile, &server), 0);
-    EXPECT_NE(sync_agent_ds_set_sync_info(profile, 0, 0, 1), 0);
-    EXPECT_NE(sync_agent_ds_set_sync_service_info(profile, &service), 0);
+    expect_refused(profile);
     EXPECT_NE(sync_agent_ds_add_profile(profile), 0);
     EXPECT_NE(sync_agent_ds_delete_profile(profile), 0);
     EXPECT_NE(sync_agent_ds_deinit(), 0);
@@ -207,20 +215,7 @@ TEST_F(SyncAgent, RefusesNullPointers) {
 
 TEST_F(SyncAgent, RefusesAProfileThatIsNull) {
     ASSERT_EQ(sync_agent_ds_init(), 0);
-    const char *name = nullptr;
-    GList *list = nullptr;
-    sync_agent_ds_server_info server{.address = "", .user_id = "", .password = ""};
-    const sync_agent_ds_service_info service{};
-    EXPECT_NE(sync_agent_ds_get_profile_name(nullptr, &name), 0);
-    EXPECT_NE(sync_agent_ds_get_server_info(nullptr, &server), 0);
-    EXPECT_NE(sync_agent_ds_get_sync_service_info(nullptr, &list), 0);
-    EXPECT_NE(sync_agent_ds_set_profile_name(nullptr, "x"), 0);
-    EXPECT_NE(sync_agent_ds_set_profile_attribute(nullptr, 1), 0);
-    EXPECT_NE(sync_agent_ds_set_server_info(nullptr, &server), 0);
-    EXPECT_NE(sync_agent_ds_set_sync_info(nullptr, 0, 0, 1), 0);
-    EXPECT_NE(sync_agent_ds_set_sync_service_info(nullptr, &service), 0);
-    EXPECT_EQ(name, nullptr);
-    EXPECT_EQ(list, nullptr);
+    expect_refused(nullptr);
 }
 
 TEST_F(SyncAgent, JournalHoldsNoPassword) {

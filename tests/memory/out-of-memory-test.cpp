@@ -4,18 +4,19 @@
 
 #include "memory/failing-memory.h"
 #include "support/files-phone.h"
+#include "support/lines.h"
 #include "support/source-dir.h"
 
 #include <zel-svc.h>
 
 #include <algorithm>
-#include <sstream>
 
 namespace {
 
 using ::testing::AnyOf;
 using ::testing::EndsWith;
 using zel_test::Asked;
+using zel_test::lines_of;
 
 constexpr const char *kDocument = "/opt/system/zel-default/output/customer-phone.xml";
 constexpr const char *kReport = "/opt/system/zel-default/output/zel-verification-report.log";
@@ -65,14 +66,6 @@ class OutOfMemory : public zel_test::FilesPhone {
 
 bool is_in(const std::string &line, const std::vector<std::string> &lines) {
     return std::find(lines.begin(), lines.end(), line) != lines.end();
-}
-
-std::vector<std::string> lines_of(const std::string &text) {
-    std::vector<std::string> lines;
-    std::istringstream in{text};
-    for (std::string line; std::getline(in, line);)
-        lines.push_back(line);
-    return lines;
 }
 
 // A report holds its seven lines of head, an empty one, and the list.

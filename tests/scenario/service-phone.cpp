@@ -1,22 +1,15 @@
 #include "service-phone.h"
 
+#include "support/lines.h"
+
 #include <algorithm>
 #include <memory>
-#include <sstream>
 
 namespace zel_test {
 
 namespace {
 
 constexpr const char *kDeclaration = "<?xml version=\"1.0\" encoding=\"UTF-8\"?>\n";
-
-std::vector<std::string> lines_of(const std::string &text) {
-    std::vector<std::string> lines;
-    std::istringstream in{text};
-    for (std::string line; std::getline(in, line);)
-        lines.push_back(line);
-    return lines;
-}
 
 } // namespace
 

@@ -1,6 +1,6 @@
 #include "sim-phone.h"
 
-#include <sstream>
+#include "support/lines.h"
 
 namespace zel_test {
 
@@ -48,12 +48,7 @@ std::vector<std::string> SimPhone::messages() {
 }
 
 std::vector<std::string> SimPhone::lines_in(const std::string &phone_path) {
-    std::vector<std::string> lines;
-    if (!exists(phone_path)) return lines;
-    std::istringstream text{read(phone_path)};
-    for (std::string line; std::getline(text, line);)
-        lines.push_back(line);
-    return lines;
+    return exists(phone_path) ? lines_of(read(phone_path)) : std::vector<std::string>{};
 }
 
 std::vector<std::string> SimPhone::journal() {

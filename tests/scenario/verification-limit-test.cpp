@@ -1,11 +1,11 @@
 // Verifications around a thousand lines, which is what a list holds.
 
 #include "service-phone.h"
+#include "support/lines.h"
 
 #include <gmock/gmock.h>
 
 #include <memory>
-#include <sstream>
 
 namespace {
 
@@ -38,11 +38,7 @@ class VerificationLimit : public zel_test::ServicePhone {
     int failed_for_imei() { return zel_svc_config_verification_for_imei(line_, sizeof line_); }
 
     std::vector<std::string> report() {
-        std::istringstream in{read("/opt/system/zel-default/output/zel-verification-report.log")};
-        std::vector<std::string> lines;
-        for (std::string line; std::getline(in, line);)
-            lines.push_back(line);
-        return lines;
+        return zel_test::lines_of(read("/opt/system/zel-default/output/zel-verification-report.log"));
     }
     // The report's list is the caller's, line by line.
     void expect_listed(int count) {

@@ -1,6 +1,7 @@
 #include "support/phone-bus.h"
 
 #include "support/bench-phone.h"
+#include "support/lines.h"
 #include "support/telephony-daemon.h"
 
 #include <array>
@@ -9,7 +10,6 @@
 #include <fcntl.h>
 #include <filesystem>
 #include <fstream>
-#include <sstream>
 #include <stdexcept>
 #include <sys/prctl.h>
 #include <sys/wait.h>
@@ -127,11 +127,7 @@ std::vector<std::string> PhoneBus::calls() {
     std::array<char, 1024> buffer{};
     for (ssize_t size = 0; (size = ::read(record_, buffer.data(), buffer.size())) > 0;)
         recorded_.append(buffer.data(), static_cast<std::size_t>(size));
-    std::vector<std::string> lines;
-    std::istringstream text(recorded_);
-    for (std::string line; std::getline(text, line);)
-        lines.push_back(line);
-    return lines;
+    return lines_of(recorded_);
 }
 
 // A bus numbers its connections: ":1.0" is the first.
