@@ -21,6 +21,7 @@ class SqliteProgram {
     explicit SqliteProgram(const std::string &file)
         : file_(file), input_(popen(("exec sqlite3 -batch '" + file + "' >/dev/null 2>&1").c_str(), "we")) {
         if (!input_) throw std::runtime_error("cannot start sqlite3");
+        run(".timeout 60000"); // it tries again when it meets wait_until_locked's own look at the database
     }
     SqliteProgram(const SqliteProgram &) = delete;
     SqliteProgram &operator=(const SqliteProgram &) = delete;
