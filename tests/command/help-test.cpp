@@ -1,4 +1,5 @@
 #include "program.h"
+#include "support/lines.h"
 #include "support/source-dir.h"
 
 #include <algorithm>
@@ -18,8 +19,7 @@ std::vector<std::string> words_of(const std::string &text) {
 
 std::size_t longest_line(const std::string &text) {
     std::size_t longest = 0;
-    std::istringstream lines{text};
-    for (std::string line; std::getline(lines, line);)
+    for (const std::string &line : lines_of(text))
         longest = std::max(longest, line.size());
     return longest;
 }

@@ -1,11 +1,11 @@
 // zel sim run, install, active, clear: what is installed for whom.
 
 #include "sim-phone.h"
+#include "support/lines.h"
 #include "support/phone-bus.h"
 
 #include <cstdlib>
 #include <gmock/gmock.h>
-#include <sstream>
 #include <sys/stat.h>
 
 using namespace zel_test;
@@ -44,8 +44,7 @@ TEST_F(ZelSimRun, ShowsThreeDigitsOfALongCodeThatTheCardHas) {
     write_networks("AAA", network("Long", "21405", one("SPCode", "987654321")) +
                               network("Other", "21405", one("SPCode", "5")));
     insert(1, "05", "9876543210");
-    std::istringstream page{run({"sim", "run"})};
-    for (std::string line; std::getline(page, line);)
+    for (const std::string &line : lines_of(run({"sim", "run"})))
         EXPECT_TRUE(line.find("(Subset)") != line.npos || line.find("9876") == line.npos) << line;
     EXPECT_EQ(run({"sim", "active"}), "SIM  OPERATOR\n1    Long (21405, MSIN 987***) of AAA\n2    none\n");
     EXPECT_EQ(json_of({"sim", "active"}).at(0).at("subset_code"), "987***");

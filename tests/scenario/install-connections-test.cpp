@@ -1,6 +1,7 @@
 // Data connections through the entry points, looked at with the sqlite3 program and in the recorded files.
 
 #include "service-phone.h"
+#include "support/lines.h"
 
 #include <array>
 #include <cstdio>
@@ -50,15 +51,11 @@ class InstallConnections : public zel_test::ServicePhone {
         write("/tmp/statement.sql", sql + ";\n");
         const std::string command = "sqlite3 -batch '" + root() + database + "' < '" + root() + "/tmp/statement.sql'";
         const std::unique_ptr<FILE, int (*)(FILE *)> pipe{popen(command.c_str(), "r"), pclose};
-        std::vector<std::string> lines;
         std::string text;
         std::array<char, 4096> chunk{};
         while (const std::size_t got = fread(chunk.data(), 1, chunk.size(), pipe.get()))
             text.append(chunk.data(), got);
-        std::istringstream stream{text};
-        for (std::string line; std::getline(stream, line);)
-            lines.push_back(line);
-        return lines;
+        return zel_test::lines_of(text);
     }
 
     void write_connections(const std::string &auto_profile = "off") {

@@ -2,6 +2,7 @@
 // trees and scripts that try to break it.
 
 #include "support/files-phone.h"
+#include "support/lines.h"
 
 #include <zel-svc.h>
 
@@ -78,8 +79,7 @@ TEST_F(Preconfiguration, AFullInstallAndThreeUpgrades) {
 
     const std::string line = "[FSUpdate] Run /";
     std::string steps;
-    std::istringstream log{run_log()};
-    for (std::string text; std::getline(log, text);)
+    for (const std::string &text : zel_test::lines_of(run_log()))
         if (text.starts_with(line)) steps += text.substr(line.size()) + "\n";
     EXPECT_EQ(steps, "DEF/rel:1_rm.\nDEF/up_1:1_rm.\nDEF/up_2:1_cp.\nBTU/up_1:1_rm.\nBTU/up_1:1_cp.\n");
 }

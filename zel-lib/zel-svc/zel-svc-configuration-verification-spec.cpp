@@ -33,11 +33,11 @@ void copy_lines(ZelSvcResultList &list) {
 } // namespace
 
 int zel_svc_config_verify_spec(std::string_view customer, ZelSvcResultList &list) {
-    zel_svc_verification_clear_results();
     const std::string path = zel_svc_customer_spec_path(customer);
     if (path.empty()) return 0;
     // What comes from the SIM card is not compared.
     zel_svc_selective_pass_read_auto_flags(path, ZEL_SVC_PARSE_ACTION_VERIFY);
+    zel_svc_verification_clear_results();
     compare_with_phone(path);
     const int failed = failed_lines();
     zel_svc_guarded([&] { copy_lines(list); });
